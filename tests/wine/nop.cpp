@@ -1,0 +1,2 @@
+// Returns once Wine is up.
+int main() {}
