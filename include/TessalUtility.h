@@ -4,9 +4,13 @@
 
 // One line a header, sorted.
 #include "DebugTrace.h"
+#include "HkDir.h"
 #include "HkEnv.h"
 #include "HkException.h"
+#include "HkFile.h"
+#include "HkMemory.h"
 #include "HkMessageManager.h"
+#include "HkPath.h"
 #include "HkStr.h"
 #include "HkStream.h"
 #include "HkString.h"
