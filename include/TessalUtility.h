@@ -4,6 +4,7 @@
 
 // One line a header, sorted.
 #include "DebugTrace.h"
+#include "FileUtility.h"
 #include "HkDir.h"
 #include "HkEnv.h"
 #include "HkException.h"
@@ -16,3 +17,4 @@
 #include "HkString.h"
 #include "TessalException.h"
 #include "TessalExport.h"
+#include "TessalSmokeMgr.h"
