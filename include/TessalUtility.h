@@ -3,6 +3,8 @@
 #pragma once
 
 // One line a header, sorted.
+#include "AcdReader.h"
+#include "DataPath.h"
 #include "DebugTrace.h"
 #include "HkEnv.h"
 #include "HkException.h"
@@ -10,5 +12,7 @@
 #include "HkStr.h"
 #include "HkStream.h"
 #include "HkString.h"
+#include "ProfileConfig.h"
+#include "ProfileKeyTable.h"
 #include "TessalException.h"
 #include "TessalExport.h"
