@@ -3,6 +3,8 @@
 #pragma once
 
 // One line a header, sorted.
+#include "AcdReader.h"
+#include "DataPath.h"
 #include "DebugTrace.h"
 #include "FileUtility.h"
 #include "HkDir.h"
@@ -15,6 +17,8 @@
 #include "HkStr.h"
 #include "HkStream.h"
 #include "HkString.h"
+#include "ProfileConfig.h"
+#include "ProfileKeyTable.h"
 #include "TessalException.h"
 #include "TessalExport.h"
 #include "TessalSmokeMgr.h"
