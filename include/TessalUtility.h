@@ -3,6 +3,7 @@
 #pragma once
 
 // One line a header, sorted.
+#include "CableInfo.h"
 #include "DebugTrace.h"
 #include "HkEnv.h"
 #include "HkException.h"
@@ -10,5 +11,7 @@
 #include "HkStr.h"
 #include "HkStream.h"
 #include "HkString.h"
+#include "NetString.h"
+#include "Streamable.h"
 #include "TessalException.h"
 #include "TessalExport.h"
