@@ -5,9 +5,13 @@
 // One line a header, sorted.
 #include "CableInfo.h"
 #include "DebugTrace.h"
+#include "HkDir.h"
 #include "HkEnv.h"
 #include "HkException.h"
+#include "HkFile.h"
+#include "HkMemory.h"
 #include "HkMessageManager.h"
+#include "HkPath.h"
 #include "HkStr.h"
 #include "HkStream.h"
 #include "HkString.h"
