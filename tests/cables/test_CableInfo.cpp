@@ -9,6 +9,7 @@
 #include <utility>
 #include <vector>
 
+#include "HkStr.h"
 #include "MessageRecorder.h"
 
 namespace {
