@@ -5,6 +5,7 @@
 // One line a header, sorted.
 #include "AcdReader.h"
 #include "DataPath.h"
+#include "CableInfo.h"
 #include "DebugTrace.h"
 #include "FileUtility.h"
 #include "HkDir.h"
@@ -19,6 +20,8 @@
 #include "HkString.h"
 #include "ProfileConfig.h"
 #include "ProfileKeyTable.h"
+#include "NetString.h"
+#include "Streamable.h"
 #include "TessalException.h"
 #include "TessalExport.h"
 #include "TessalSmokeMgr.h"

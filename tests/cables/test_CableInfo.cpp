@@ -1,0 +1,218 @@
+#include "CableInfo.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <limits>
+#include <sstream>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "HkStr.h"
+#include "MessageRecorder.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+TEST(CableInfo, ANewRecordTellsNothing) {
+    CableInfo cable;
+    EXPECT_EQ(cable.getPortNumber(), -1);
+    EXPECT_EQ(cable.getPortSpeed(), 0);
+    EXPECT_EQ(cable.getFlags(), 0U);
+    EXPECT_FALSE(cable.isConnected());
+    for (const char* text : {cable.getPortName(), cable.getCableName(), cable.getESN(), cable.getAlias(),
+                             cable.getServerName(), static_cast<char*>(nullptr)}) {
+        if (text != nullptr) {
+            EXPECT_STREQ(text, "");
+        }
+    }
+    EXPECT_STREQ(cable.getDisplayPortName(), "NULL");
+    EXPECT_STREQ(cable.getSpeedString(), "0");
+    cable.setPortName(nullptr);
+    EXPECT_STREQ(cable.getPortName(), "");
+}
+
+TEST(CableInfo, EverySpeedConvertsInAllDirections) {
+    const std::vector<std::pair<int, const char*>> displays = {
+        {0, "0"},
+        {9600, "9600"},
+        {19200, "19200"},
+        {38400, "38400"},
+        {57600, "57600"},
+        {187000, "187 khz"},
+        {200000, "200 KHZ"},
+        {300000, "300 KHz"},
+        {375000, "375 KHz"},
+        {625000, "625 KHz"},
+        {750000, "750 KHz"},
+        {1250000, "1.25 mhz"},
+        {1500000, "1.5 MHz"},
+        {2500000, "2.5 MHz"},
+        {3000000, "3 MHz"},
+        {5000000, "5 MHz"},
+        {6000000, "6 MHz"},
+        {10000000, "10 MHz"},
+        {12000000, "12 MHz"},
+        {24000000, "24 MHz"},
+    };
+    const MessageRecorder messages;
+    for (const auto& [speed, display] : displays) {
+        SCOPED_TRACE(display);
+        EXPECT_EQ(CableInfo::getSpeedNumber(display), speed);
+        EXPECT_EQ(CableInfo::getSpeedNumber(std::to_string(speed).c_str()), speed);
+        EXPECT_EQ(CableInfo::getSpeedString(speed), std::to_string(speed));
+        EXPECT_EQ(HkStr::ICompare(CableInfo::getDisplaySpeedString(speed), display), 0);
+    }
+    EXPECT_THAT(messages.all(), IsEmpty());
+}
+
+TEST(CableInfo, SpeedsOutsideTheTableAreReported) {
+    const MessageRecorder messages;
+    EXPECT_EQ(CableInfo::getSpeedString(1234), nullptr);
+    CableInfo cable;
+    cable.setPortSpeed(-1);
+    EXPECT_EQ(cable.getDisplaySpeedString(), nullptr);
+    for (const char* text : {"5MHz", "", static_cast<const char*>(nullptr)}) {
+        EXPECT_EQ(CableInfo::getSpeedNumber(text), -1);
+    }
+    EXPECT_THAT(messages.info(), ElementsAre("Invalid speed 1234.\n", "Invalid speed -1.\n"));
+    EXPECT_THAT(messages.status(), ElementsAre("Invalid input speed string 5MHz.\n", "Invalid input speed string .\n",
+                                               "Invalid input speed string .\n"));
+}
+
+TEST(CableInfo, PortNamesGiveGenericNameAndNumber) {
+    struct Case {
+        const char* name;
+        const char* generic;
+        int number;
+    };
+    const Case cases[] = {
+        {"COM3", "COM", 2},       {"com", "COM", -1},     {"USB21", "USB2", 0},
+        {"usb21", "USB2", 0},     {"USB1", "USB", 0},     {"ttyS0", "COM", -1},
+        {"/dev/ttyS1", "COM", 0}, {"ttya", "COM", 0},     {"ttyb", "COM", 1},
+        {"tty", "COM", 1},        {"parport0", "LPT", 0}, {"/dev/parport12", "LPT", 12},
+        {"LPT1", "LPT", 0},       {"lpt", "LPT", -1},     {"SVF", "SVF", -1},
+        {"STAX", "STAPL", -1},    {"ST", nullptr, -1},    {"", nullptr, -1},
+        {nullptr, nullptr, -1},   {"TTYS1", nullptr, -1}, {"COM-99999999999", "COM", std::numeric_limits<int>::min()},
+    };
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.name != nullptr ? c.name : "null");
+        const MessageRecorder messages;
+        EXPECT_STREQ(CableInfo::getPortGenericName(c.name), c.generic);
+        EXPECT_EQ(CableInfo::getPortNumber(c.name), c.number);
+        const std::string report =
+            std::string("Invalid Display Port Name ") + (c.name != nullptr ? c.name : "") + ".\n";
+        EXPECT_EQ(messages.info(),
+                  c.generic != nullptr ? std::vector<std::string>() : std::vector<std::string>(2, report));
+    }
+}
+
+TEST(CableInfo, TypeAndDisplayNameFollowThePortName) {
+    struct Case {
+        const char* port;
+        unsigned int flags;
+        int number;
+        CableInfo::CableType type;
+        const char* display;
+    };
+    const Case cases[] = {
+        {"usb2", 0, 0, CableInfo::CABLE_USB2, "USB21"},
+        {"USB2", 3, -1, CableInfo::CABLE_USB2, "USB2"},
+        {"USB2", 4, 0, CableInfo::CABLE_USB2_FLAG4, "NULL"},
+        {"USB2", 8, 0, CableInfo::CABLE_USB2_FLAG8, "NULL"},
+        {"USB2", 12, 0, CableInfo::CABLE_USB2_FLAG8, "NULL"},
+        {"USB", 0, -1, CableInfo::CABLE_USB, "USB"},
+        {"Usb", 4, 9, CableInfo::CABLE_USB, "USB10"},
+        {"COM", 0, 0, CableInfo::CABLE_COM, "COM1"},
+        {"LPT", 0, 1, CableInfo::CABLE_LPT, "LPT2"},
+        {"NULL", 0, 1, CableInfo::CABLE_NULL, "NULL"},
+        {"design.SVF", 0, 1, CableInfo::CABLE_SVF, "SVF"},
+        {"design.zsvf", 0, -1, CableInfo::CABLE_SVF, "SVF"},
+        {"d.stapl", 0, 1, CableInfo::CABLE_STAPL, "STAPL"},
+        {"design.txt", 0, 1, CableInfo::CABLE_NONE, "NULL"},
+        {"LPT1", 0, 1, CableInfo::CABLE_NONE, "NULL"},
+        {"a.svfsvfsvf", 0, 1, CableInfo::CABLE_NONE, "NULL"},
+        {"LPT", 0, std::numeric_limits<int>::max(), CableInfo::CABLE_LPT, "LPT2147483648"},
+    };
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.port);
+        CableInfo cable;
+        cable.setPortName(c.port);
+        cable.setFlags(c.flags);
+        cable.setPortNumber(c.number);
+        EXPECT_EQ(cable.getCableType(), c.type);
+        EXPECT_STREQ(cable.getDisplayPortName(), c.display);
+    }
+}
+
+TEST(CableInfo, ADecidedTypeStaysUntilThePortNameIsSet) {
+    CableInfo cable;
+    cable.setPortName("USB2");
+    EXPECT_EQ(cable.getCableType(), CableInfo::CABLE_USB2);
+    cable.setFlags(8);
+    EXPECT_EQ(cable.getCableType(), CableInfo::CABLE_USB2);
+    const CableInfo copy(cable);
+    EXPECT_EQ(CableInfo(copy).getCableType(), CableInfo::CABLE_USB2);
+    cable.setPortName("USB2");
+    EXPECT_EQ(cable.getCableType(), CableInfo::CABLE_USB2_FLAG8);
+}
+
+TEST(CableInfo, DisplayNamesOfDeviceNodesFollowAStreamedPortName) {
+    struct Case {
+        const char* decided;
+        const char* streamed;
+        const char* display;
+    };
+    const Case cases[] = {
+        {"COM", "1 ", "COM2"},           {"COM", "5\nttyS1\n1\n", "ttyS1"}, {"COM", "4\nttya\n0\n", "ttya"},
+        {"COM", "4\nttya\n7\n", "ttyb"}, {"COM", "5\nother\n0\n", "COM2"},  {"LPT", "8\nparport0\n0\n", "parport0"},
+        {"LPT", "5\nother\n0\n", "LPT1"}};
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.streamed);
+        CableInfo cable;
+        cable.setPortName(c.decided);
+        cable.setPortNumber(1);
+        cable.getDisplayPortName();
+        std::istringstream in(c.streamed);
+        cable.readStream(in);
+        EXPECT_STREQ(cable.getDisplayPortName(), c.display);
+    }
+}
+
+TEST(CableInfo, WhiteSpaceIsRemovedInPlaceAndTheNameIsKept) {
+    char text[] = " a\tb\r\nc\vd ";
+    EXPECT_EQ(CableInfo::getCableNameWithoutSpace(text), text);
+    EXPECT_STREQ(text, "abc\vd");
+    EXPECT_EQ(CableInfo::removeSpace(nullptr), nullptr);
+    CableInfo cable;
+    cable.setCableName("my cable");
+    EXPECT_STREQ(cable.getCableNameWithoutSpace(), "mycable");
+    EXPECT_EQ(cable.getCableNameWithoutSpace(), cable.getCableNameWithoutSpace());
+    cable.setCableName(" ");
+    EXPECT_STREQ(cable.getCableNameWithoutSpace(), "");
+}
+
+TEST(CableInfo, DumpPrintsEachFieldAsALineOfItsOwn) {
+    const std::string dashes(42, '-');
+    MessageRecorder messages;
+    CableInfo cable;
+    cable.dump();
+    EXPECT_THAT(messages.status(), ElementsAre(dashes + "\n"));
+    messages.clear();
+    cable.setCableName("my cable");
+    cable.setPortName("LPT");
+    cable.setPortNumber(0);
+    cable.setPortSpeed(1234);
+    cable.dump();
+    EXPECT_THAT(
+        messages.status(),
+        ElementsAre(dashes + "\n", "Cable Name: my cable\n", "Port Name: LPT\n", "Port Number: 0\n",
+                    "Port Speed: 1234\n", "Display Cable Name: my cable\n", "Cable Name w/o space: mycable\n",
+                    "Display Port Speed: unknown\n", "Port Speed string: unknown\n", "Display Port Name: LPT1\n"));
+    EXPECT_THAT(messages.info(), ElementsAre("Invalid speed 1234.\n", "Invalid speed 1234.\n"));
+}
+
+}  // namespace
