@@ -4,11 +4,17 @@
 
 // One line a header, sorted.
 #include "DebugTrace.h"
+#include "DeviceOptionsMgr.h"
 #include "HkEnv.h"
 #include "HkException.h"
 #include "HkMessageManager.h"
 #include "HkStr.h"
 #include "HkStream.h"
 #include "HkString.h"
+#include "ModeOption.h"
+#include "ModeOptionsMgr.h"
+#include "OptionsMgr.h"
+#include "Preference.h"
+#include "ProgramOption.h"
 #include "TessalException.h"
 #include "TessalExport.h"
