@@ -3,6 +3,8 @@
 #pragma once
 
 // One line a header, sorted.
+#include "AcdReader.h"
+#include "DataPath.h"
 #include "DebugTrace.h"
 #include "DeviceOptionsMgr.h"
 #include "HkEnv.h"
@@ -16,5 +18,7 @@
 #include "OptionsMgr.h"
 #include "Preference.h"
 #include "ProgramOption.h"
+#include "ProfileConfig.h"
+#include "ProfileKeyTable.h"
 #include "TessalException.h"
 #include "TessalExport.h"
