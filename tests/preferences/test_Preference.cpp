@@ -1,0 +1,124 @@
+// The preference table over tests/data/preferences. The table lives as long as the process, so every case puts back
+// what it changed, and only the first case may look at it before it is loaded.
+
+#include "Preference.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <limits>
+
+#include "DataPath.h"
+#include "MessageRecorder.h"
+#include "TessalException.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+using Row = TessalPreference::PREFERENCE;
+
+constexpr Row automatic = Row(0);
+constexpr Row level = Row(1);
+constexpr Row alone = Row(2);
+constexpr Row single = Row(3);
+constexpr Row mixed = Row(4);
+constexpr Row outside[] = {Row(5), Row(-1), Row(std::numeric_limits<int>::max())};
+
+TessalPreference& loaded() {
+    DeviceProfile::setDataPath(TEST_DATA_DIR "/preferences");
+    return *TessalPreference::getPreferenceObject();
+}
+
+TEST(PrefOption, KeepsTheCallersLetterCase) {
+    TessalPrefOption option;
+    EXPECT_STREQ(option.getOption(), "");
+    EXPECT_STREQ(option.getValue(), "");
+    option.addOption("first");
+    option.addOption("Speed");
+    MessageRecorder messages;
+    EXPECT_FALSE(option.setValue("x"));
+    option.add2AllValue("True");
+    option.add2AllValue("False");
+    EXPECT_TRUE(option.setValue("tRUE"));
+    EXPECT_STREQ(option.getValue(), "tRUE");
+    EXPECT_FALSE(option.setValue("maybe"));
+    EXPECT_FALSE(option.setValue(nullptr));
+    EXPECT_STREQ(option.getValue(), "tRUE");
+    EXPECT_THAT(messages.info(), ElementsAre("x is not a legal preference value for Speed.\n",
+                                             "maybe is not a legal preference value for Speed.\n",
+                                             " is not a legal preference value for Speed.\n"));
+}
+
+TEST(Preference, TheTableIsThatOfTheDataFile) {
+    TessalPreference& preferences = loaded();
+    EXPECT_EQ(&preferences, TessalPreference::getPreferenceObject());
+    const MessageRecorder messages;
+    TessalPreference::dump();
+    EXPECT_THAT(
+        messages.status(),
+        ElementsAre("Preference Table\n", "Name                 Setting             \n",
+                    "Auto                 True                \n", "Level                1                   \n",
+                    "                                         \n", "Single               only                \n",
+                    "Mixed                aB                  \n"));
+    EXPECT_TRUE(preferences.isPreferenceTrue(automatic));
+    EXPECT_EQ(preferences.getPreferenceValue(level), 1);
+    EXPECT_EQ(preferences.getPreferenceValue(automatic), 0);
+    EXPECT_STREQ(TessalPreference::pref2String(mixed), "Mixed");
+    EXPECT_STREQ(TessalPreference::pref2String(alone), "");
+    EXPECT_EQ(TessalPreference::string2Pref("LEVEL"), level);
+}
+
+TEST(Preference, SettingStoresUpperCaseAndRefusesTheRest) {
+    TessalPreference& preferences = loaded();
+    const MessageRecorder messages;
+    EXPECT_TRUE(preferences.setPreference(automatic, false));
+    EXPECT_STREQ(preferences.getPreference(automatic), "FALSE");
+    EXPECT_FALSE(preferences.isPreferenceTrue(automatic));
+    EXPECT_TRUE(preferences.setPreference(level, 3));
+    EXPECT_FALSE(preferences.setPreference(level, 4));
+    EXPECT_EQ(preferences.getPreferenceValue(level), 3);
+    EXPECT_TRUE(preferences.setPreference(mixed, "cd"));
+    EXPECT_STREQ(preferences.getPreference(mixed), "CD");
+    EXPECT_FALSE(preferences.setPreference(single, true));
+    EXPECT_FALSE(preferences.setPreference(alone, ""));
+    EXPECT_FALSE(preferences.setPreference(mixed, static_cast<const char*>(nullptr)));
+    EXPECT_THAT(messages.info(), ElementsAre("4 is not a legal preference value for Level.\n",
+                                             "TRUE is not a legal preference value for Single.\n",
+                                             " is not a legal preference value for .\n",
+                                             " is not a legal preference value for Mixed.\n"));
+    EXPECT_TRUE(preferences.setPreference(automatic, "true"));
+    EXPECT_STREQ(preferences.getPreference(automatic), "TRUE");
+    EXPECT_TRUE(preferences.setPreference(level, "1"));
+    EXPECT_TRUE(preferences.setPreference(mixed, "ab"));
+}
+
+TEST(Preference, RowsAndNamesOutsideTheTable) {
+    TessalPreference& preferences = loaded();
+    MessageRecorder messages;
+    for (const Row row : outside) {
+        EXPECT_STREQ(preferences.getPreference(row), "");
+        EXPECT_FALSE(preferences.isPreferenceTrue(row));
+        EXPECT_EQ(preferences.getPreferenceValue(row), 0);
+        EXPECT_THROW(TessalPreference::pref2String(row), DataNotFoundException);
+    }
+    EXPECT_THAT(messages.all(), IsEmpty());
+    EXPECT_FALSE(preferences.setPreference(outside[0], "x"));
+    for (const char* name : {"nosuch", "Alone", static_cast<const char*>(nullptr)}) {
+        EXPECT_THROW(TessalPreference::string2Pref(name), DataNotFoundException);
+    }
+    EXPECT_THAT(messages.info(), ElementsAre("Preference 5 is not defined. Check data file tessal.acd.\n",
+                                             "nosuch is not in Preference Table.\n",
+                                             "Alone is not in Preference Table.\n", " is not in Preference Table.\n"));
+}
+
+TEST(Preference, TheTableOutlivesTheObject) {
+    TessalPreference& preferences = loaded();
+    EXPECT_TRUE(preferences.setPreference(level, 2));
+    TessalPreference::removePreferenceObject();
+    TessalPreference::removePreferenceObject();
+    EXPECT_EQ(TessalPreference::getPreferenceObject()->getPreferenceValue(level), 2);
+    EXPECT_TRUE(TessalPreference::getPreferenceObject()->setPreference(level, 1));
+}
+
+}  // namespace
