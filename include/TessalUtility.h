@@ -6,6 +6,7 @@
 #include "AcdReader.h"
 #include "DataPath.h"
 #include "CableInfo.h"
+#include "CommandSet.h"
 #include "DebugTrace.h"
 #include "FileUtility.h"
 #include "HkDir.h"
