@@ -15,6 +15,18 @@ if(WIN32)
     set(TESSAL_HOST_LIBRARIES ws2_32 setupapi)
 endif()
 
+# g++ for 64-bit Windows aligns the stack to 16 bytes and yet moves 32-byte vectors on it with aligned moves; the
+# assembler turns those into unaligned ones. Without that the vectors stay out.
+if(MINGW AND CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
+    include(CheckCXXCompilerFlag)
+    check_cxx_compiler_flag(-Wa,-muse-unaligned-vector-move TESSAL_UNALIGNED_VECTOR_MOVES)
+    if(TESSAL_UNALIGNED_VECTOR_MOVES)
+        add_compile_options(-Wa,-muse-unaligned-vector-move)
+    else()
+        add_compile_definitions(TESSAL_NO_WIDE_VECTORS)
+    endif()
+endif()
+
 function(tessal_settings target)
     target_compile_features(${target} PUBLIC cxx_std_17)
     set_target_properties(${target} PROPERTIES

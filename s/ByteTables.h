@@ -1,0 +1,73 @@
+// What one byte means in text and in reverse: the tables behind the conversions. They are indexed through unsigned
+// char, so that no sign slips in.
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+
+namespace ByteTables {
+
+/// What the digit table gives for a character that is no hex digit.
+constexpr unsigned char notADigit = 0xFF;
+
+constexpr std::array<unsigned char, 256> makeDigitValues() {
+    std::array<unsigned char, 256> table{};
+    for (unsigned char& value : table) {
+        value = notADigit;
+    }
+    for (unsigned char digit = 0; digit < 10; ++digit) {
+        table['0' + digit] = digit;
+    }
+    for (unsigned char letter = 0; letter < 6; ++letter) {
+        table['a' + letter] = static_cast<unsigned char>(10 + letter);
+        table['A' + letter] = static_cast<unsigned char>(10 + letter);
+    }
+    return table;
+}
+
+constexpr std::array<unsigned char, 256> makeMirroredBytes() {
+    std::array<unsigned char, 256> table{};
+    for (unsigned byte = 0; byte < 256; ++byte) {
+        for (unsigned bit = 0; bit < 8; ++bit) {
+            table[byte] = static_cast<unsigned char>(table[byte] | ((byte >> bit & 1U) << (7 - bit)));
+        }
+    }
+    return table;
+}
+
+constexpr char hexDigits[] = "0123456789abcdef";
+
+constexpr std::array<std::array<char, 2>, 256> makeHexPairs() {
+    std::array<std::array<char, 2>, 256> table{};
+    for (unsigned byte = 0; byte < 256; ++byte) {
+        table[byte] = {hexDigits[byte >> 4], hexDigits[byte & 15U]};
+    }
+    return table;
+}
+
+constexpr std::array<std::array<char, 8>, 256> makeBitTexts() {
+    std::array<std::array<char, 8>, 256> table{};
+    for (unsigned byte = 0; byte < 256; ++byte) {
+        for (unsigned bit = 0; bit < 8; ++bit) {
+            table[byte][bit] = (byte >> bit & 1U) != 0 ? '1' : '0';
+        }
+    }
+    return table;
+}
+
+/// Value of a hex digit of either case.
+inline constexpr auto digitValue = makeDigitValues();
+/// The byte with its bits in reverse order.
+inline constexpr auto mirroredByte = makeMirroredBytes();
+/// The byte as two hex digits, the high one first.
+inline constexpr auto hexPair = makeHexPairs();
+/// The byte as eight characters 0 and 1, the least significant bit first.
+inline constexpr auto bitText = makeBitTexts();
+
+/// Value of the character as a hex digit, or notADigit.
+constexpr unsigned char valueOf(char digit) {
+    return digitValue[static_cast<unsigned char>(digit)];
+}
+
+}  // namespace ByteTables
