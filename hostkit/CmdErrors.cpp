@@ -14,12 +14,15 @@ struct Text {
 };
 
 constexpr Text texts[] = {
+    {Problem::NoFormat, "there is no argument format"},
     {Problem::MalformedFormat, "the argument format is malformed at character {number}: {expected}"},
     {Problem::NoCommand, "there is no command word"},
     {Problem::NullArgument, "argument {number} is null"},
     {Problem::UnknownSwitch, "unknown switch {argument}{nearest}"},
     {Problem::AmbiguousSwitch, "switch {argument} is short for {expected}: write more of it"},
     {Problem::UnexpectedArgument, "unexpected argument {argument}{nearest}"},
+    {Problem::UnquotedGroup,
+     "{argument} belongs to {name}: put the words of its value between one pair of double quotes"},
     {Problem::MissingValue, "{name} needs {expected}, and there is none"},
     {Problem::BadValue, "{name} needs {expected}, not {argument}{nearest}"},
     {Problem::NoValueTaken, "{name} takes no value, but was given {argument}"},

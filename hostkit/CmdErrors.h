@@ -9,12 +9,14 @@
 namespace HostKit::cmd {
 
 enum class Problem {
+    NoFormat,
     MalformedFormat,
     NoCommand,
     NullArgument,
     UnknownSwitch,
     AmbiguousSwitch,
     UnexpectedArgument,
+    UnquotedGroup,
     MissingValue,
     BadValue,
     NoValueTaken,

@@ -9,7 +9,7 @@ namespace HostKit::cmd {
 namespace {
 
 constexpr const char* blanks = " \t\r\n";
-constexpr std::string_view reserved = " \t\r\n[](){}<>|\"'=.*,:";
+constexpr std::string_view reserved = " \t\r\n[](){}<>|\"'=.*";
 
 struct TypeWord {
     const char* word;
@@ -50,13 +50,16 @@ public:
     explicit Reader(Format& format) : m_format(format), m_text(format.text) {}
 
     void run() {
-        skipBlanks();
+        checkCharacters();
         readHelp(m_format.help);
         while (skipBlanks()) {
             readItem();
         }
         checkPositionals();
         sortNames();
+        if (m_format.isMalformed()) {
+            forget();
+        }
     }
 
 private:
@@ -67,6 +70,23 @@ private:
     bool skipBlanks() {
         m_at = std::min(m_text.find_first_not_of(blanks, m_at), m_text.size());
         return !atEnd();
+    }
+
+    /// A format stands in a cell of a table, which these two separate.
+    void checkCharacters() {
+        const std::size_t found = m_text.find_first_of(",:");
+        if (found != std::string_view::npos) {
+            fail(found, "the characters comma and colon cannot stand in a format");
+        }
+    }
+
+    /// What was read of a malformed format is of no use.
+    void forget() {
+        m_format.help.clear();
+        m_format.rules.clear();
+        m_format.oneOfs.clear();
+        m_format.positionals.clear();
+        m_format.names.clear();
     }
 
     void fail(std::size_t offset, std::string reason) {
@@ -161,14 +181,15 @@ private:
         const std::size_t begin = m_at;
         OneOf oneOf;
         oneOf.required = required;
-        while (skipBlanks() && !take('}')) {
+        bool closed = false;
+        while (skipBlanks() && !(closed = take('}'))) {
             readElement(false);
             if (!m_format.isMalformed()) {
                 m_format.rules.back().inOneOf = true;
                 oneOf.rules.push_back(static_cast<int>(m_format.rules.size()) - 1);
             }
         }
-        if (m_text[m_at - 1] != '}' || oneOf.rules.size() < 2) {
+        if (!closed || oneOf.rules.size() < 2) {
             return fail(begin, "expected } behind at least two arguments");
         }
         m_format.oneOfs.push_back(std::move(oneOf));
@@ -330,13 +351,18 @@ private:
         for (const int index : m_format.positionals) {
             const Rule& rule = m_format.rule(index);
             if (list) {
-                fail(0, "no argument can follow the list before <" + rule.value.name + ">");
+                fail(offsetOf(index), "no argument can follow the list before <" + rule.value.name + ">");
             } else if (optional && rule.required) {
-                fail(0, "the required <" + rule.value.name + "> stands behind an optional one");
+                fail(offsetOf(index), "the required <" + rule.value.name + "> stands behind an optional one");
             }
             list = rule.value.list;
             optional = optional || !rule.required;
         }
+    }
+
+    std::size_t offsetOf(int rule) const {
+        const std::vector<Name>& names = m_format.names;
+        return std::find_if(names.begin(), names.end(), [rule](const Name& name) { return name.rule == rule; })->offset;
     }
 
     void sortNames() {

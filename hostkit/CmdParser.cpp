@@ -183,7 +183,7 @@ void Parser::takeOperand(const char* token, std::string_view view) {
     }
     const int index = nextPositional();
     if (index < 0) {
-        return reportUnknown(Problem::UnexpectedArgument, view);
+        return reportOperand(view);
     }
     ++m_result.rules[static_cast<std::size_t>(index)].count;
     m_result.order.push_back(index);
@@ -207,7 +207,7 @@ void Parser::checkRequired() {
         const bool excused = rule.kind == Kind::Positional && m_skipped;
         if (rule.required && m_result.rules[i].count == 0 && !excused && m_result.countError()) {
             const std::string expected = rule.help.empty() ? expectation(rule.value) : rule.help;
-            report(Problem::Missing, {{}, usageOf(rule), expected.empty() ? expected : ": " + expected, {}, 0});
+            report(Problem::Missing, {{}, bareUsage(rule), expected.empty() ? expected : ": " + expected, {}, 0});
         }
     }
 }
@@ -255,6 +255,17 @@ void Parser::report(Problem problem, const Details& details) {
 void Parser::reportUnknown(Problem problem, std::string_view token) {
     if (m_result.countError()) {
         report(problem, {token, {}, {}, nearestName(m_format, token.substr(0, token.find('='))), 0});
+    }
+}
+
+/// Nothing takes the token. A group whose words were not quoted falls into several tokens, of which the first fits.
+void Parser::reportOperand(std::string_view token) {
+    const bool follows = !m_result.order.empty();
+    const Rule* const last = follows ? &m_format.rule(m_result.order.back()) : nullptr;
+    if (last == nullptr || findMember(last->value, token.substr(0, token.find(':'))) == nullptr) {
+        reportUnknown(Problem::UnexpectedArgument, token);
+    } else if (m_result.countError()) {
+        report(Problem::UnquotedGroup, {token, label(*last), {}, {}, 0});
     }
 }
 

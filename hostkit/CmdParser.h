@@ -67,6 +67,7 @@ private:
 
     void report(Problem problem, const Details& details);
     void reportUnknown(Problem problem, std::string_view token);
+    void reportOperand(std::string_view token);
     void reportAmbiguous(std::string_view token);
     void reportValue(const Rule& rule, std::string_view text);
 

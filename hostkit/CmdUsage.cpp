@@ -14,12 +14,14 @@ std::string valueUsage(const Value& value) {
     return value.optional ? "[" + text + "]" : text;
 }
 
-/// The rule with its value, without brackets.
-std::string bareUsage(const Rule& rule) {
-    if (rule.kind == Kind::Positional) {
-        return valueUsage(rule.value);
+/// The rule with brackets and dots: "[-u <code>]".
+std::string usageOf(const Rule& rule) {
+    const std::string text = bareUsage(rule);
+    const std::string bracketed = rule.required ? text : "[" + text + "]";
+    if (!rule.repeated) {
+        return bracketed;
     }
-    return rule.value.type == Type::None ? label(rule) : label(rule) + " " + valueUsage(rule.value);
+    return (rule.required ? "(" + text + ")" : bracketed) + "...";
 }
 
 const OneOf* oneOfBeginningWith(const Format& format, int rule) {
@@ -38,7 +40,10 @@ std::string oneOfUsage(const Format& format, const OneOf& oneOf) {
 
 /// Help and what the value must be, for the right column.
 std::string explanation(const Rule& rule) {
-    const std::string expected = rule.value.type == Type::Text ? std::string() : expectation(rule.value);
+    std::string expected = expectation(rule.value);
+    if (expected == "a text") {
+        expected.clear();  // goes without saying
+    }
     if (rule.help.empty() || expected.empty()) {
         return rule.help + expected;
     }
@@ -61,13 +66,11 @@ std::string label(const Rule& rule) {
     return text;
 }
 
-std::string usageOf(const Rule& rule) {
-    const std::string text = bareUsage(rule);
-    const std::string bracketed = rule.required ? text : "[" + text + "]";
-    if (!rule.repeated) {
-        return bracketed;
+std::string bareUsage(const Rule& rule) {
+    if (rule.kind == Kind::Positional) {
+        return valueUsage(rule.value);
     }
-    return (rule.required ? "(" + text + ")" : bracketed) + "...";
+    return rule.value.type == Type::None ? label(rule) : label(rule) + " " + valueUsage(rule.value);
 }
 
 std::string usageLine(const Format& format, const char* command) {

@@ -52,12 +52,6 @@ bool fitsHex(const Value& value, std::string_view text) {
            std::all_of(text.begin(), text.end(), [](char ch) { return digitValue(ch) < 16; });
 }
 
-const Member* findMember(const Value& value, std::string_view name) {
-    const auto found = std::find_if(value.members.begin(), value.members.end(),
-                                    [name](const Member& member) { return equalFolded(member.name, name); });
-    return found != value.members.end() ? &*found : nullptr;
-}
-
 /// Takes the next word of a group, up to a blank, off the text.
 std::string_view takeWord(std::string_view& text) {
     text.remove_prefix(std::min(text.find_first_not_of(' '), text.size()));
@@ -77,7 +71,7 @@ std::string join(const std::vector<std::string>& words, const char* separator) {
 
 /// " from 1 to 255", with @p unit behind the numbers; empty where there are no bounds.
 std::string bounds(const Value& value, const char* from, const char* unit) {
-    const bool isLow = value.low > 1 || (value.low != std::numeric_limits<std::int64_t>::min() && *unit == '\0');
+    const bool isLow = value.low != std::numeric_limits<std::int64_t>::min();
     const bool isHigh = value.high != std::numeric_limits<std::int64_t>::max();
     const std::string low = std::to_string(value.low);
     const std::string high = std::to_string(value.high);
@@ -94,11 +88,11 @@ std::string bounds(const Value& value, const char* from, const char* unit) {
 }
 
 std::string groupExpectation(const Value& value) {
-    std::string text = "one text of " + join(value.choices, "|");
+    std::string text = "one argument of the form \"" + join(value.choices, "|");
     for (const Member& member : value.members) {
         text += " [" + member.name + (member.hasText ? ":<text>]" : "]");
     }
-    return text;
+    return text + "\"";
 }
 
 }  // namespace
@@ -132,6 +126,12 @@ const std::string* findChoice(const std::vector<std::string>& choices, std::stri
     const auto found = std::find_if(choices.begin(), choices.end(),
                                     [text](const std::string& choice) { return equalFolded(choice, text); });
     return found != choices.end() ? &*found : nullptr;
+}
+
+const Member* findMember(const Value& value, std::string_view name) {
+    const auto found = std::find_if(value.members.begin(), value.members.end(),
+                                    [name](const Member& member) { return equalFolded(member.name, name); });
+    return found != value.members.end() ? &*found : nullptr;
 }
 
 bool splitGroup(const Value& value, std::string_view text, std::vector<GroupWord>& words) {

@@ -32,6 +32,8 @@ bool fits(const Value& value, std::string_view text);
 std::string expectation(const Value& value);
 /// The choice as the format spells it, null when the text is none.
 const std::string* findChoice(const std::vector<std::string>& choices, std::string_view text);
+/// The member of a group by its name, null when there is none.
+const Member* findMember(const Value& value, std::string_view name);
 /// Equal without regard to case.
 bool equalFolded(std::string_view a, std::string_view b);
 

@@ -68,9 +68,14 @@ struct Tokens {
 }  // namespace
 
 struct HkCmdArgs::State {
-    State(int argc, const char* const* argv, const char* text) : tokens(argc, argv), format(cmd::compile(text)) {}
+    State(int argc, const char* const* argv, const char* text)
+        : tokens(argc, argv), format(cmd::compile(text)), hasFormat(text != nullptr) {}
 
     void parse(bool abbreviations) {
+        if (!hasFormat) {
+            addError(cmd::errorText(cmd::Problem::NoFormat, {}));
+            return;
+        }
         if (format->isMalformed()) {
             addError(malformedText(*format));
             return;
@@ -102,7 +107,7 @@ struct HkCmdArgs::State {
             origin.report().issueInfo("%s%s\n", prefix.c_str(),
                                       cmd::errorText(cmd::Problem::MoreErrors, {{}, {}, {}, {}, more}).c_str());
         }
-        if (withUsage && !format->isMalformed()) {
+        if (withUsage && hasFormat && !format->isMalformed()) {
             origin.report().issueInfo("%s\n", cmd::usageLine(*format, cmd::printable(command()).c_str()).c_str());
         }
     }
@@ -140,6 +145,7 @@ struct HkCmdArgs::State {
 
     Tokens tokens;
     std::shared_ptr<const cmd::Format> format;
+    bool hasFormat;
     cmd::Result result;
 };
 
@@ -303,6 +309,9 @@ std::vector<HkCmdArgInfo> HkCmdArgs::describe(const char* format) {
 }
 
 HkString HkCmdArgs::checkFormat(const char* format) {
+    if (format == nullptr) {
+        return toHkString(cmd::errorText(cmd::Problem::NoFormat, {}));
+    }
     const std::shared_ptr<const cmd::Format> compiled = cmd::compile(format);
     return compiled->isMalformed() ? toHkString(malformedText(*compiled)) : HkString();
 }

@@ -1,0 +1,90 @@
+// Writes a parsed command and its errors as text, one line for each thing, as docs/argument-format.md shows them.
+#pragma once
+
+#include <algorithm>
+#include <string>
+#include <vector>
+
+#include "HkCmdArgs.h"
+
+using Lines = std::vector<std::string>;
+
+/// Splits at blanks; double quotes hold a word together, and an empty pair is an empty word.
+inline Lines splitCommand(const std::string& line) {
+    Lines words;
+    bool quoted = false;
+    bool open = false;
+    for (const char ch : line) {
+        if (ch == ' ' && !quoted) {
+            open = false;
+            continue;
+        }
+        if (!open) {
+            words.emplace_back();
+            open = true;
+        }
+        if (ch == '"') {
+            quoted = !quoted;
+        } else {
+            words.back() += ch;
+        }
+    }
+    return words;
+}
+
+inline std::vector<const char*> pointersTo(const Lines& words) {
+    std::vector<const char*> pointers;
+    for (const std::string& word : words) {
+        pointers.push_back(word.c_str());
+    }
+    return pointers;
+}
+
+inline std::string groupDump(const HkCmdArgs& args, const HkCmdArgInfo& info, const char* format, int index) {
+    std::string text = "{" + std::string(args.groupLeader(info.names[0], index).view());
+    // The members are not part of the description: ask for each word that the format holds.
+    for (const std::string& word : splitCommand(format)) {
+        const std::string member = word.substr(0, word.find_first_of("*>"));
+        if (args.groupHas(info.names[0], member.c_str(), index) && text.find(" " + member) == std::string::npos) {
+            const bool hasText = word.find('*') != std::string::npos;
+            const std::string carried(args.groupText(info.names[0], member.c_str(), index).view());
+            text += " " + member + (hasText ? "(" + carried + ")" : "");
+        }
+    }
+    return text + "}";
+}
+
+inline std::string dumpOne(const HkCmdArgs& args, const HkCmdArgInfo& info, const char* format) {
+    const char* const name = info.names[0];
+    std::string line = *name != '\0' ? name : "\"\"";
+    if (args.count(name) > 1 && info.kind != HkCmdArgInfo::Kind::Positional) {
+        line += " x" + std::to_string(args.count(name));
+    }
+    for (int i = 0; i < args.valueCount(name); ++i) {
+        const bool isGroup = info.type == HkCmdArgInfo::Type::Group;
+        line += i == 0 ? " = " : " ";
+        line += isGroup ? groupDump(args, info, format, i) : args.text(name, i);
+    }
+    return line;
+}
+
+/// The errors, each behind "! "; without errors what was given, in the order of the command.
+inline Lines dump(const HkCmdArgs& args, const char* format) {
+    Lines lines;
+    for (const HkString& error : args.errors()) {
+        lines.push_back("! " + std::string(error.view()));
+    }
+    if (!lines.empty()) {
+        return lines;
+    }
+    const std::vector<HkCmdArgInfo> infos = HkCmdArgs::describe(format);
+    for (const HkString& name : args.order()) {
+        for (const HkCmdArgInfo& info : infos) {
+            const std::string line = info.names[0] == name ? dumpOne(args, info, format) : std::string();
+            if (!line.empty() && std::find(lines.begin(), lines.end(), line) == lines.end()) {
+                lines.push_back(line);
+            }
+        }
+    }
+    return lines;
+}
