@@ -178,7 +178,7 @@ private:
     }
 
     void readOneOf(bool required) {
-        const std::size_t begin = m_at;
+        const std::size_t begin = m_at - 1;
         OneOf oneOf;
         oneOf.required = required;
         bool closed = false;
