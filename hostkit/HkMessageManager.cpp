@@ -3,8 +3,9 @@
 #include <atomic>
 #include <cstdarg>
 #include <cstdio>
+#include <memory>
 #include <mutex>
-#include <string>
+#include <new>
 
 #include "HkEnv.h"
 #include "HkStr.h"
@@ -32,10 +33,8 @@ Outlet& outlet() {
 }
 
 bool isTraced() {
-    if (trace.load(std::memory_order_relaxed) == Trace::Unknown) {
-        HkMessageManager::refreshTrace();
-    }
-    return trace.load(std::memory_order_relaxed) == Trace::On;
+    const Trace known = trace.load(std::memory_order_relaxed);
+    return known == Trace::Unknown ? HkMessageManager::refreshTrace() : known == Trace::On;
 }
 
 void writeToConsole(const HkMessage& message) {
@@ -56,20 +55,22 @@ void deliver(const HkMessage& message) {
     }
 }
 
-/// Formats the text, on the stack where it fits, and sends the message on.
+/// Formats the text, on the stack where it fits, and sends the message on. A report never fails: a text that cannot be
+/// formatted goes out as its bare format, one that there is no memory for as its beginning.
 void formatAndDeliver(HkMessage message, const char* format, std::va_list arguments) {
     char shortText[512];
+    std::unique_ptr<char[]> longText;
     std::va_list again;
     va_copy(again, arguments);
-    const int length = std::vsnprintf(shortText, sizeof shortText, format != nullptr ? format : "", arguments);
-    std::string longText;
-    message.text = shortText;
-    if (length < 0) {
-        message.text = format;  // cannot be formatted: better the bare words than nothing
-    } else if (static_cast<std::size_t>(length) >= sizeof shortText) {
-        longText.resize(static_cast<std::size_t>(length));
-        std::vsnprintf(longText.data(), longText.size() + 1, format, again);
-        message.text = longText.c_str();
+    const int written = std::vsnprintf(shortText, sizeof shortText, format != nullptr ? format : "", arguments);
+    const std::size_t size = static_cast<std::size_t>(written) + 1;
+    message.text = written >= 0 ? shortText : format;
+    if (written >= 0 && size > sizeof shortText) {
+        longText.reset(new (std::nothrow) char[size]);
+    }
+    if (longText != nullptr) {
+        std::vsnprintf(longText.get(), size, format, again);
+        message.text = longText.get();
     }
     va_end(again);
     deliver(message);
@@ -129,10 +130,10 @@ bool HkMessageManager::isDebugHeard() {
     return handled.load(std::memory_order_relaxed) || isTraced();
 }
 
-void HkMessageManager::refreshTrace() {
-    const char* const value = HkEnv::GetEnv(traceVariable);
-    const bool on = value != nullptr && HkStr::ICompare(value, "ON") == 0;
-    trace.store(on ? Trace::On : Trace::Off, std::memory_order_relaxed);
+bool HkMessageManager::refreshTrace() {
+    const bool isOn = HkStr::ICompare(HkEnv::GetEnv(traceVariable), "ON") == 0;
+    trace.store(isOn ? Trace::On : Trace::Off, std::memory_order_relaxed);
+    return isOn;
 }
 
 }  // namespace HostKit

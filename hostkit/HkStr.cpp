@@ -75,12 +75,8 @@ int HkStr::ICompare(const char* a, const char* b) {
 }
 
 int HkStr::INCompare(const char* a, const char* b, std::size_t n) {
-    if (n == 0) {
-        return 0;
-    }
-    if (a == nullptr || b == nullptr) {
-        return a == nullptr ? -1 : 1;
-    }
+    a = orEmpty(a);
+    b = orEmpty(b);
     for (std::size_t i = 0; i < n; ++i) {
         const int difference = folded(a[i]) - folded(b[i]);
         if (difference != 0 || a[i] == '\0') {

@@ -1,205 +1,217 @@
 #include "HkString.h"
 
-#include <atomic>
+#include <algorithm>
 #include <cstdarg>
-#include <cstddef>
 #include <cstdio>
-#include <cstring>
 #include <new>
 #include <stdexcept>
 #include <string>
 
 #include "HkStr.h"
+#include "SmallBlocks.h"
+#include "platform/SingleThread.h"
 
 namespace HostKit {
 namespace {
 
-/// What stands before the text; the length word is the last of it.
-struct Block {
-    std::atomic<std::uint32_t> owners;
-    std::uint32_t capacity;
-    std::uint32_t unused;
-    std::uint32_t length;
-};
-static_assert(sizeof(Block) == 16 && offsetof(Block, length) == 12, "the length word stands directly before the text");
+constexpr std::size_t headSize = 16;
+constexpr std::size_t smallRoom = SmallBlocks::size - headSize;  ///< for a short text with its terminator
+constexpr std::size_t smallCapacity = smallRoom - 1;
 
-/// The text of every empty string that owns no memory; never counted, written or released.
-struct EmptyText {
-    Block block;
-    char terminator;
-};
-EmptyText emptyText{{{0}, 0, 0, 0}, '\0'};
-
-char* sharedEmpty() {
-    return &emptyText.terminator;
+/// Room for a text of @p length bytes, and as much again, so that appending costs constant time a byte.
+std::size_t grown(std::size_t length) {
+    const std::size_t generous = length * 2;
+    return generous < HkString::npos ? generous : length;
 }
 
-Block& blockOf(char* text) {
-    return reinterpret_cast<Block*>(text)[-1];
+/// Copies 1 to smallCapacity bytes without a call, by two pieces of a fixed size that may overlap.
+void copyShort(char* to, const char* from, std::size_t length) {
+    const auto copyEnds = [=](auto piece) {
+        constexpr std::size_t size = decltype(piece)::value;
+        char head[size];
+        char tail[size];
+        std::memcpy(head, from, size);
+        std::memcpy(tail, from + length - size, size);
+        std::memcpy(to, head, size);
+        std::memcpy(to + length - size, tail, size);
+    };
+    if (length >= 16) {
+        copyEnds(std::integral_constant<std::size_t, 16>());
+    } else if (length >= 8) {
+        copyEnds(std::integral_constant<std::size_t, 8>());
+    } else if (length >= 4) {
+        copyEnds(std::integral_constant<std::size_t, 4>());
+    } else if (length >= 2) {
+        copyEnds(std::integral_constant<std::size_t, 2>());
+    } else {
+        *to = *from;
+    }
 }
 
-char* allocate(std::size_t capacity) {
-    if (capacity >= HkString::npos) {
+void addOwner(std::atomic<std::uint32_t>& owners) {
+    if (platform::isSingleThreaded()) {
+        owners.store(owners.load(std::memory_order_relaxed) + 1, std::memory_order_relaxed);
+    } else {
+        owners.fetch_add(1, std::memory_order_relaxed);
+    }
+}
+
+/// Gives the number of owners left. A last owner has nobody to count against.
+std::uint32_t removeOwner(std::atomic<std::uint32_t>& owners) {
+    const std::uint32_t present = owners.load(std::memory_order_acquire);
+    if (present == 1) {
+        return 0;
+    }
+    if (platform::isSingleThreaded()) {
+        owners.store(present - 1, std::memory_order_relaxed);
+        return present - 1;
+    }
+    return owners.fetch_sub(1, std::memory_order_acq_rel) - 1;
+}
+
+std::uint32_t indexOrNone(std::size_t index) {
+    return index != std::string_view::npos ? static_cast<std::uint32_t>(index) : HkString::npos;
+}
+
+}  // namespace
+
+// A short text has a small block of its own, which costs less to copy than a count shared by threads; a long text is
+// shared and counted. Which of both it is shows in its capacity.
+
+HkString::EmptyText HkString::s_empty{{{0}, 0, 0, 0}, '\0'};
+
+/// A text of one owner whose content and length are not yet set.
+char* HkString::newBlock(std::size_t capacity) {
+    if (capacity <= smallCapacity) {
+        return shortTextIn(SmallBlocks::take());
+    }
+    if (capacity >= npos) {
         throw std::length_error("HkString: the text would be too long");
     }
-    void* const memory = ::operator new(sizeof(Block) + capacity + 1);
-    return reinterpret_cast<char*>(new (memory) Block{{1}, static_cast<std::uint32_t>(capacity), 0, 0} + 1);
+    void* const memory = ::operator new(headSize + capacity + 1);
+    return reinterpret_cast<char*>(new (memory) Head{{1}, static_cast<std::uint32_t>(capacity), 0, 0} + 1);
 }
 
-void setLength(char* text, std::size_t length) {
-    blockOf(text).length = static_cast<std::uint32_t>(length);
-    text[length] = '\0';
+char* HkString::shortTextIn(void* block) noexcept {
+    static_assert(sizeof(Head) == headSize && offsetof(Head, length) == 12, "the length word is next to the text");
+    return reinterpret_cast<char*>(new (block) Head{{1}, smallCapacity, 0, 0} + 1);
 }
 
-char* makeText(std::string_view content) {
+char* HkString::newText(std::string_view content) {
     if (content.empty()) {
-        return sharedEmpty();
+        return emptyText();
     }
-    char* const text = allocate(content.size());
+    void* const block = content.size() <= smallCapacity ? SmallBlocks::takeSpare() : nullptr;
+    if (block == nullptr) {
+        return newTextByHeap(content);
+    }
+    char* const text = shortTextIn(block);
+    copyShort(text, content.data(), content.size());
+    setLength(text, content.size());
+    return text;
+}
+
+char* HkString::newTextByHeap(std::string_view content) {
+    char* const text = newBlock(content.size());
     std::memcpy(text, content.data(), content.size());
     setLength(text, content.size());
     return text;
 }
 
-char* share(char* text) noexcept {
-    if (text != sharedEmpty()) {
-        blockOf(text).owners.fetch_add(1, std::memory_order_relaxed);
+char* HkString::copiedText(char* text) {
+    Head& head = headOf(text);
+    if (head.capacity > smallCapacity) {
+        addOwner(head.owners);
+        return text;
     }
-    return text;
+    if (text == emptyText()) {
+        return text;
+    }
+    char* const copy = newBlock(smallCapacity);
+    std::memcpy(copy, text, smallRoom);
+    headOf(copy).length = head.length;
+    return copy;
 }
 
-void release(char* text) noexcept {
-    if (text != sharedEmpty() && blockOf(text).owners.fetch_sub(1, std::memory_order_acq_rel) == 1) {
-        ::operator delete(&blockOf(text));
+void HkString::releaseBlock(char* text) noexcept {
+    Head& head = headOf(text);
+    if (head.capacity == smallCapacity) {
+        SmallBlocks::give(&head);
+    } else if (removeOwner(head.owners) == 0) {
+        ::operator delete(&head);
     }
 }
 
-bool isOwnedAlone(char* text) {
-    return text != sharedEmpty() && blockOf(text).owners.load(std::memory_order_acquire) == 1;
-}
-
-std::string_view viewOf(const char* text) {
-    return {text != nullptr ? text : "", HkStr::Len(text)};
-}
-
-/// Room for a text of @p length bytes, with half as much again so that appending costs constant time a byte.
-std::size_t grown(std::size_t length) {
-    const std::size_t generous = length + length / 2 + 16;
-    return generous < HkString::npos ? generous : length;
-}
-
-/// Makes the text one of this string alone that has room for @p room bytes.
-void makeOwn(char*& text, std::size_t room) {
-    if (isOwnedAlone(text) && blockOf(text).capacity >= room) {
+void HkString::assign(std::string_view content) {
+    if (!hasRoom(content.size())) {
+        replaceText(newText(content));
         return;
     }
-    const std::size_t length = blockOf(text).length;
-    char* const own = allocate(length < room ? grown(room) : length);
-    std::memcpy(own, text, length);
-    setLength(own, length);
-    release(text);
-    text = own;
+    std::memmove(m_text, content.data(), content.size());
+    setLength(m_text, content.size());
 }
 
-void append(char*& text, std::string_view content) {
+void HkString::append(std::string_view content) {
+    const std::size_t length = Length();
+    if (!hasRoom(length + content.size())) {
+        appendToNewBlock(content);
+        return;
+    }
+    std::memcpy(m_text + length, content.data(), content.size());
+    setLength(m_text, length + content.size());
+}
+
+/// The old text is released last: the content may be a piece of it.
+void HkString::appendToNewBlock(std::string_view content) {
     if (content.empty()) {
         return;
     }
-    const std::size_t length = blockOf(text).length;
-    char* const former = share(text);  // the content may lie in it
-    const std::size_t room = length + content.size();
-    if (blockOf(former).owners.load(std::memory_order_acquire) == 2 && blockOf(former).capacity >= room) {
-        std::memmove(former + length, content.data(), content.size());
-        setLength(former, room);
-        release(former);
+    const std::size_t length = Length();
+    const std::size_t total = length + content.size();
+    char* const text = newBlock(length != 0 ? grown(total) : total);
+    std::memcpy(text, m_text, length);
+    std::memcpy(text + length, content.data(), content.size());
+    setLength(text, total);
+    replaceText(text);
+}
+
+/// Makes the text this string's alone, with room for @p room bytes, at least those that it has.
+void HkString::makeOwn(std::size_t room) {
+    if (hasRoom(room)) {
         return;
     }
-    char* own = nullptr;
-    try {
-        own = allocate(grown(room));
-    } catch (...) {
-        release(former);
-        throw;
+    const std::size_t length = Length();
+    char* const text = newBlock(length < room ? grown(room) : length);
+    std::memcpy(text, m_text, length);
+    setLength(text, length);
+    replaceText(text);
+}
+
+HkString& HkString::operator=(const HkString& other) {
+    if (this != &other) {
+        replaceText(copiedText(other.m_text));
     }
-    std::memcpy(own, former, length);
-    std::memcpy(own + length, content.data(), content.size());
-    setLength(own, room);
-    release(text);
-    release(former);
-    text = own;
-}
-
-}  // namespace
-
-HkString::HkString() noexcept : m_text(sharedEmpty()) {}
-HkString::HkString(const char* text) : m_text(makeText(viewOf(text))) {}
-HkString::HkString(std::string_view text) : m_text(makeText(text)) {}
-HkString::HkString(const HkString& other) noexcept : m_text(share(other.m_text)) {}
-HkString::HkString(HkString&& other) noexcept : m_text(other.m_text) {
-    other.m_text = sharedEmpty();
-}
-HkString::~HkString() {
-    release(m_text);
-}
-
-HkString& HkString::operator=(const HkString& other) noexcept {
-    char* const former = m_text;
-    m_text = share(other.m_text);
-    release(former);
     return *this;
-}
-
-HkString& HkString::operator=(HkString&& other) noexcept {
-    char* const former = m_text;
-    m_text = other.m_text;
-    other.m_text = former;
-    return *this;
-}
-
-HkString& HkString::operator=(const char* text) {
-    char* const former = m_text;
-    m_text = makeText(viewOf(text));
-    release(former);
-    return *this;
-}
-
-HkString& HkString::operator+=(const HkString& other) {
-    append(m_text, other.view());
-    return *this;
-}
-
-HkString& HkString::operator+=(const char* text) {
-    append(m_text, viewOf(text));
-    return *this;
-}
-
-HkString& HkString::operator+=(char ch) {
-    append(m_text, {&ch, 1});
-    return *this;
-}
-
-void HkString::Append(const char* text, std::uint32_t count) {
-    append(m_text, text == nullptr ? std::string_view() : count == npos ? viewOf(text) : std::string_view(text, count));
-}
-
-void HkString::Empty() {
-    release(m_text);
-    m_text = sharedEmpty();
 }
 
 HkString& HkString::Format(const char* format, ...) {
+    char shortText[128];
     std::va_list arguments;
     std::va_list again;
     va_start(arguments, format);
     va_copy(again, arguments);
-    const int length = format != nullptr ? std::vsnprintf(nullptr, 0, format, arguments) : 0;
-    std::string formatted(length > 0 ? static_cast<std::size_t>(length) : 0, '\0');
-    if (!formatted.empty()) {
-        std::vsnprintf(formatted.data(), formatted.size() + 1, format, again);
+    const int written = std::vsnprintf(shortText, sizeof shortText, format != nullptr ? format : "", arguments);
+    const std::size_t length = written > 0 ? static_cast<std::size_t>(written) : 0;
+    if (length < sizeof shortText) {
+        assign({shortText, length});
+    } else {
+        std::string longText(length, '\0');
+        std::vsnprintf(longText.data(), length + 1, format, again);
+        assign(longText);
     }
     va_end(again);
     va_end(arguments);
-    return *this = HkString(std::string_view(formatted));
+    return *this;
 }
 
 void HkString::Insert(std::uint32_t index, char ch, std::uint32_t count) {
@@ -207,8 +219,8 @@ void HkString::Insert(std::uint32_t index, char ch, std::uint32_t count) {
         return;
     }
     const std::size_t length = Length();
-    const std::size_t place = index < length ? index : length;
-    makeOwn(m_text, length + count);
+    const std::size_t place = std::min<std::size_t>(index, length);
+    makeOwn(length + count);
     std::memmove(m_text + place + count, m_text + place, length - place);
     std::memset(m_text + place, ch, count);
     setLength(m_text, length + count);
@@ -216,36 +228,29 @@ void HkString::Insert(std::uint32_t index, char ch, std::uint32_t count) {
 
 std::uint32_t HkString::GetIndexOfFirstChar(char ch, char second) const {
     const char wanted[] = {ch, second};
-    const std::size_t index = view().find_first_of(std::string_view(wanted, second != '\0' ? 2 : 1));
-    return index != std::string_view::npos ? static_cast<std::uint32_t>(index) : npos;
+    return indexOrNone(view().find_first_of(std::string_view(wanted, second != '\0' ? 2 : 1)));
 }
 
 std::uint32_t HkString::GetIndexOfString(const char* text, CompareType mode) const {
-    const std::string_view wanted = viewOf(text);
+    const std::string_view wanted = HkStr::View(text);
     if (mode == CompareExact) {
-        const std::size_t index = view().find(wanted);
-        return index != std::string_view::npos ? static_cast<std::uint32_t>(index) : npos;
+        return indexOrNone(view().find(wanted));
     }
-    for (std::size_t index = 0; index + wanted.size() <= Length(); ++index) {
-        if (HkStr::INCompare(m_text + index, wanted.data(), wanted.size()) == 0) {
-            return static_cast<std::uint32_t>(index);
-        }
-    }
-    return npos;
+    const std::string_view whole = view();
+    const auto isSame = [](char a, char b) { return HkStr::ToLower(a) == HkStr::ToLower(b); };
+    const auto found = std::search(whole.begin(), whole.end(), wanted.begin(), wanted.end(), isSame);
+    const bool isThere = found != whole.end() || wanted.empty();
+    return isThere ? static_cast<std::uint32_t>(found - whole.begin()) : npos;
 }
 
 void HkString::MakeUpper() {
-    makeOwn(m_text, Length());
-    for (char* c = m_text; c != m_text + Length(); ++c) {
-        *c = HkStr::ToUpper(*c);
-    }
+    makeOwn(Length());
+    std::transform(m_text, m_text + Length(), m_text, &HkStr::ToUpper);
 }
 
 void HkString::MakeLower() {
-    makeOwn(m_text, Length());
-    for (char* c = m_text; c != m_text + Length(); ++c) {
-        *c = HkStr::ToLower(*c);
-    }
+    makeOwn(Length());
+    std::transform(m_text, m_text + Length(), m_text, &HkStr::ToLower);
 }
 
 }  // namespace HostKit

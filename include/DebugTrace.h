@@ -16,5 +16,5 @@ public:
     void print(const char* format, ...) const TESSAL_PRINTF(2, 3);
 
 private:
-    unsigned char m_flag = 0;
+    unsigned char m_flag;
 };

@@ -45,8 +45,8 @@ private:
     const char* m_file;
     const char* m_revision;
     int m_line;
-    char m_text[textSize];
-    wchar_t m_localized[textSize];
+    char m_text[textSize] = {};
+    wchar_t m_localized[textSize] = {};
 };
 
 }  // namespace HostKit

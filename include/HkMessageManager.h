@@ -50,9 +50,10 @@ public:
     /// True while a debug message would go somewhere.
     static bool isDebugHeard();
 
-    /// Reads the trace variable again. The manager reads it when it is first asked for a debug message; a caller that
-    /// changes the variable later makes that known here. Building a DebugTrace does it too.
-    static void refreshTrace();
+    /// Reads the trace variable again and gives whether it is on. The manager reads it when it is first asked for a
+    /// debug message; a caller that changes the variable later makes that known here. Building a DebugTrace does it
+    /// too.
+    static bool refreshTrace();
 
 private:
     HkMessageManager() = default;

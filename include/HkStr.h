@@ -4,6 +4,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <string_view>
 
 #include "TessalExport.h"
 
@@ -13,6 +14,8 @@ namespace HostKit {
 /// operation asks the locale. Destination buffers belong to the caller, who makes them large enough.
 class TESSAL_API HkStr {
 public:
+    /// The text as a view, of the empty text for null.
+    static std::string_view View(const char* text) { return text != nullptr ? std::string_view(text) : ""; }
     /// Length in bytes; 0 for null.
     static std::size_t Len(const char* text);
     /// Copies @p source with its terminator; gives @p dest. A null destination stays null.
@@ -31,9 +34,9 @@ public:
     /// First place of @p wanted in @p text, or null.
     static char* FindString(char* text, const char* wanted);
     static const char* FindString(const char* text, const char* wanted);
-    /// Compares without regard to case: below, at or above 0. A null text equals nothing, not even another null.
+    /// Compares without regard to case: below, at or above 0.
     static int ICompare(const char* a, const char* b);
-    /// The same over at most the first @p n bytes; with @p n 0 all texts are equal, null or not.
+    /// The same over at most the first @p n bytes.
     static int INCompare(const char* a, const char* b, std::size_t n);
     /// Non-zero when the whole text matches the pattern, in which `*` stands for any run of characters; case does not
     /// count. Takes at most length of text times length of pattern steps.

@@ -2,9 +2,14 @@
 /// The text class of the library.
 #pragma once
 
+#include <atomic>
+#include <cstddef>
 #include <cstdint>
+#include <cstring>
 #include <string_view>
+#include <utility>
 
+#include "HkStr.h"
 #include "TessalExport.h"
 
 namespace HostKit {
@@ -12,7 +17,7 @@ namespace HostKit {
 /// Text as one pointer to zero-terminated bytes, with the 32-bit length in the four bytes before them.
 ///
 /// The pointer is never null, and its memory form is fixed: callers read both the pointer and the length word without
-/// a call. The text may hold any byte, zero too. Copies share their text until one of them changes, which never
+/// a call. The text may hold any byte, zero too. Copies of a long text share it until one of them changes, which never
 /// shows; separate objects may be used by separate threads. A text may be a piece of the string's own text wherever
 /// a text is taken. Where a result would pass 4294967294 bytes, std::length_error is thrown; every operation either
 /// completes or leaves the string as it was.
@@ -24,27 +29,51 @@ public:
     /// How GetIndexOfString compares.
     enum CompareType { CompareExact = 0, CompareIgnoreCase = 1 };
 
-    HkString() noexcept;
+    HkString() noexcept : m_text(emptyText()) {}
     /// Copies the text; null gives the empty text.
-    HkString(const char* text);  // NOLINT(google-explicit-constructor): a text stands for a string everywhere
-    HkString(const HkString& other) noexcept;
-    HkString(HkString&& other) noexcept;
-    /// Copies @p length bytes, which may hold zeros.
-    explicit HkString(std::string_view text);
-    ~HkString();
+    HkString(const char* text)  // NOLINT(google-explicit-constructor): a text stands for a string everywhere
+        : m_text(newText(HkStr::View(text))) {}
+    /// Copies the bytes, which may hold zeros.
+    explicit HkString(std::string_view text) : m_text(newText(text)) {}
+    HkString(const HkString& other) : m_text(copiedText(other.m_text)) {}
+    HkString(HkString&& other) noexcept : m_text(std::exchange(other.m_text, emptyText())) {}
+    ~HkString() { releaseText(m_text); }
 
-    HkString& operator=(const HkString& other) noexcept;
-    HkString& operator=(HkString&& other) noexcept;
-    HkString& operator=(const char* text);
+    HkString& operator=(const HkString& other);
+    HkString& operator=(HkString&& other) noexcept {
+        std::swap(m_text, other.m_text);
+        return *this;
+    }
+    HkString& operator=(const char* text) {
+        assign(HkStr::View(text));
+        return *this;
+    }
 
-    HkString& operator+=(const HkString& other);
-    HkString& operator+=(const char* text);
-    HkString& operator+=(char ch);
+    HkString& operator+=(const HkString& other) {
+        append(other.view());
+        return *this;
+    }
+    HkString& operator+=(const char* text) {
+        append(HkStr::View(text));
+        return *this;
+    }
+    HkString& operator+=(char ch) {
+        const std::size_t length = Length();
+        if (hasRoom(length + 1)) {
+            m_text[length] = ch;
+            setLength(m_text, length + 1);
+        } else {
+            appendToNewBlock({&ch, 1});
+        }
+        return *this;
+    }
 
-    /// Appends @p count bytes of @p text; npos means up to its terminator.
-    void Append(const char* text, std::uint32_t count);
+    /// Appends @p count bytes of @p text; npos means up to its terminator. Null appends nothing.
+    void Append(const char* text, std::uint32_t count) {
+        append(text == nullptr || count == npos ? HkStr::View(text) : std::string_view(text, count));
+    }
     /// Makes the string empty.
-    void Empty();
+    void Empty() noexcept { releaseText(std::exchange(m_text, emptyText())); }
     /// Replaces the text by the formatted one. Gives the string itself.
     HkString& Format(const char* format, ...) TESSAL_PRINTF(2, 3);
     /// Puts @p count copies of @p ch before the position @p index; a position past the end is the end.
@@ -61,17 +90,62 @@ public:
     operator const char*() const noexcept { return m_text; }  // NOLINT(google-explicit-constructor): part of the form
     const char* c_str() const noexcept { return m_text; }
     /// Length in bytes, without the terminator.
-    std::uint32_t Length() const noexcept { return reinterpret_cast<const std::uint32_t*>(m_text)[-1]; }
+    std::uint32_t Length() const noexcept { return headOf(m_text).length; }
     bool IsEmpty() const noexcept { return Length() == 0; }
     std::string_view view() const noexcept { return {m_text, Length()}; }
 
 private:
+    /// What stands before a text; the length word is the last of it.
+    struct Head {
+        std::atomic<std::uint32_t> owners;  ///< strings that share the text
+        std::uint32_t capacity;             ///< bytes that the text has room for, without the terminator
+        std::uint32_t unused;
+        std::uint32_t length;
+    };
+    /// The text of every string that is empty from its start: never counted, written or released.
+    struct EmptyText {
+        Head head;
+        char terminator;
+    };
+
+    static EmptyText s_empty;
+
+    static char* emptyText() noexcept { return &s_empty.terminator; }
+    static Head& headOf(char* text) noexcept { return reinterpret_cast<Head*>(text)[-1]; }
+
+    static void setLength(char* text, std::size_t length) noexcept {
+        headOf(text).length = static_cast<std::uint32_t>(length);
+        text[length] = '\0';
+    }
+    static char* newBlock(std::size_t capacity);
+    static char* shortTextIn(void* block) noexcept;
+    static char* newText(std::string_view content);
+    static char* newTextByHeap(std::string_view content);
+    static char* copiedText(char* text);
+    static void releaseText(char* text) noexcept {
+        if (text != emptyText()) {
+            releaseBlock(text);
+        }
+    }
+    static void releaseBlock(char* text) noexcept;
+
+    /// True when the text is this string's alone and has room for @p length bytes.
+    bool hasRoom(std::size_t length) const noexcept {
+        const Head& head = headOf(m_text);
+        return length <= head.capacity && head.owners.load(std::memory_order_acquire) == 1;
+    }
+    void assign(std::string_view content);
+    void append(std::string_view content);
+    void appendToNewBlock(std::string_view content);
+    void replaceText(char* text) noexcept { releaseText(std::exchange(m_text, text)); }
+    void makeOwn(std::size_t room);
+
     char* m_text;
 };
 
 /// Equal: the same length and the same bytes; case counts.
 inline bool operator==(const HkString& a, const HkString& b) {
-    return a.view() == b.view();
+    return a.c_str() == b.c_str() || a.view() == b.view();
 }
 inline bool operator!=(const HkString& a, const HkString& b) {
     return !(a == b);
@@ -82,7 +156,7 @@ inline bool operator<(const HkString& a, const HkString& b) {
 }
 /// Compares with a zero-terminated text; null is the empty text.
 inline bool operator==(const HkString& a, const char* b) {
-    return a.view() == std::string_view(b != nullptr ? b : "");
+    return a.view() == HkStr::View(b);
 }
 inline bool operator!=(const HkString& a, const char* b) {
     return !(a == b);

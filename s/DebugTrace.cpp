@@ -3,15 +3,9 @@
 #include <cstdarg>
 #include <cstdio>
 
-#include "HkEnv.h"
 #include "HkMessageManager.h"
-#include "HkStr.h"
 
-DebugTrace::DebugTrace() {
-    const char* const value = HkEnv::GetEnv("ZRX_TESSAL_TRACE_FLAG");
-    m_flag = value != nullptr && HkStr::ICompare(value, "ON") == 0 ? 1 : 0;
-    HkMessageManager::refreshTrace();
-}
+DebugTrace::DebugTrace() : m_flag(HkMessageManager::refreshTrace() ? 1 : 0) {}
 
 void DebugTrace::print(const char* format, ...) const {
     if (m_flag != 1 || format == nullptr) {

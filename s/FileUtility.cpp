@@ -15,10 +15,6 @@ namespace {
 constexpr UnitOrigin origin{"../s/FileUtility", "$Revision: 1.1 $"};
 constexpr std::string_view separators = "/\\";
 
-std::string_view viewOf(const char* text) {
-    return {text != nullptr ? text : "", HkStr::Len(text)};
-}
-
 /// The text before the last of these characters, all of it when there is none.
 std::string_view beforeLast(std::string_view text, std::string_view characters) {
     return text.substr(0, text.find_last_of(characters));
@@ -78,16 +74,16 @@ std::string_view climbed(std::string_view root, std::size_t levels) {
 }  // namespace
 
 HkString FileUtility::getTail(const char* path) {
-    const std::string_view text = viewOf(path);
+    const std::string_view text = HkStr::View(path);
     return HkString(text.substr(text.find_last_of(separators) + 1));  // npos + 1 is 0
 }
 
 HkString FileUtility::getHead(const char* path) {
-    return HkString(beforeLast(viewOf(path), separators));
+    return HkString(beforeLast(HkStr::View(path), separators));
 }
 
 HkString FileUtility::getBase(const char* path) {
-    return HkString(beforeLast(viewOf(path), "."));
+    return HkString(beforeLast(HkStr::View(path), "."));
 }
 
 bool FileUtility::isObjectFile(const char* path) {
@@ -101,13 +97,13 @@ bool FileUtility::rmdir(const char* path) {
 }
 
 bool FileUtility::copyFile(const char* fromDir, const char* toDir, const char* name) {
-    const std::string_view directory = viewOf(toDir);
+    const std::string_view directory = HkStr::View(toDir);
     if (!HkFile::exist(toDir) && !HkFile::mkdir(toDir, true)) {
         origin.report().issueInfo("Failed to make destination directory %s.\n", directory.data());
         return false;
     }
-    const std::string source = joined(viewOf(fromDir), viewOf(name));
-    const std::string destination = joined(directory, viewOf(name));
+    const std::string source = joined(HkStr::View(fromDir), HkStr::View(name));
+    const std::string destination = joined(directory, HkStr::View(name));
     const bool isCopied = HkFile::copy(source.c_str(), destination.c_str());
     if (!isCopied) {
         origin.report().issueInfo("Failed to copy file from %s to %s.\n", source.c_str(), destination.c_str());
@@ -116,7 +112,7 @@ bool FileUtility::copyFile(const char* fromDir, const char* toDir, const char* n
 }
 
 HkString FileUtility::convertPath(HkString path, HkString base) {
-    const std::string_view text = viewOf(path);
+    const std::string_view text = HkStr::View(path);
     if (isAbsolute(text)) {
         return path;
     }
@@ -126,7 +122,7 @@ HkString FileUtility::convertPath(HkString path, HkString base) {
         return path;
     }
     const HkString root = startsWithParent(text) || base.IsEmpty() ? HkFile::getcwd() : base;
-    const HkString result(joined(climbed(viewOf(root), front.levels), front.tail));
+    const HkString result(joined(climbed(HkStr::View(root), front.levels), front.tail));
     if (!HkFile::exist(result)) {
         origin.report().issueInfo("Path does not exist. Please check the path parameters %s, %s\n", path.c_str(),
                                   base.c_str());
