@@ -32,6 +32,7 @@
 #include "Streamable.h"
 #include "LRBitVec.h"
 #include "RLBitVec.h"
+#include "Register.h"
 #include "TessalException.h"
 #include "TessalExport.h"
 #include "TessalSmokeMgr.h"
