@@ -13,9 +13,9 @@ complain() {
     failed=1
 }
 
-# Files of these folders with one of the endings .h and .cpp; folders that are not there are passed over.
+# The files of these folders with one of the endings .h and .cpp; a folder may be missing.
 sources() {
-    find "$@" -name '*.h' -o -name '*.cpp' 2>/dev/null | sort
+    { find "$@" -name '*.h' -o -name '*.cpp' 2>/dev/null || true; } | sort
 }
 
 sources "${library[@]}" examples benchmarks tests | xargs clang-format --dry-run -Werror ||
@@ -31,13 +31,12 @@ expected=$(cd include && ls *.h | grep -vx TessalUtility.h | LC_ALL=C sort)
 [ "$listed" = "$expected" ] ||
     complain "include/TessalUtility.h does not list each header once, sorted:"$'\n'"$(diff <(echo "$listed") <(echo "$expected"))"
 
-compile=(-std=c++17 -fsyntax-only -Iinclude -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror -x c++)
-compile_header() {
-    g++ "$@"
+compile_text() {
+    g++ -std=c++17 -fsyntax-only -Iinclude -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror -x c++ - <<<"$1"
 }
-echo "$expected" | xargs -P "$jobs" -I{} g++ "${compile[@]}" include/{} -Wno-pragma-once-outside-header ||
-    complain "A header does not compile alone."
-echo "$expected" | tac | sed 's/.*/#include "&"/' | g++ "${compile[@]}" - || complain "Headers depend on their order."
+export -f compile_text
+xargs -P "$jobs" -I{} bash -c 'compile_text "#include \"{}\""' <<<"$expected" || complain "A header does not stand alone."
+compile_text "$(tac <<<"$expected" | sed 's/.*/#include "&"/')" || complain "The headers depend on their order."
 
 for script in run test .ci/run cmake/*.sh tests/suites/*.sh tests/suites/lib/*.sh; do
     bash -n "$script" || complain "$script is no script."
