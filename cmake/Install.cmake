@@ -20,11 +20,20 @@ write_basic_package_version_file(${PROJECT_BINARY_DIR}/TessalUtilityConfigVersio
 install(FILES ${PROJECT_BINARY_DIR}/TessalUtilityConfig.cmake ${PROJECT_BINARY_DIR}/TessalUtilityConfigVersion.cmake
         DESTINATION ${TESSAL_CMAKE_DIR} COMPONENT development)
 
-if(BUILD_SHARED_LIBS)
-    set(TESSAL_PC_CFLAGS "")
-else()
-    set(TESSAL_PC_CFLAGS "-DTESSALUTILITY_STATIC")
+# A static library's callers link what it calls, too.
+set(TESSAL_PC_CFLAGS "")
+set(TESSAL_PC_LIBS "")
+if(NOT BUILD_SHARED_LIBS)
+    set(TESSAL_PC_CFLAGS " -DTESSALUTILITY_STATIC")
+    set(TESSAL_PC_LIBS " ${CMAKE_THREAD_LIBS_INIT}")
+    foreach(library IN LISTS TESSAL_HOST_LIBRARIES)
+        string(APPEND TESSAL_PC_LIBS " -l${library}")
+    endforeach()
 endif()
+# The file finds its prefix from its own place, so an installation may be moved.
+file(RELATIVE_PATH TESSAL_PC_PREFIX ${CMAKE_INSTALL_FULL_LIBDIR}/pkgconfig ${CMAKE_INSTALL_PREFIX})
+file(RELATIVE_PATH TESSAL_PC_LIBDIR ${CMAKE_INSTALL_PREFIX} ${CMAKE_INSTALL_FULL_LIBDIR})
+file(RELATIVE_PATH TESSAL_PC_INCLUDEDIR ${CMAKE_INSTALL_PREFIX} ${CMAKE_INSTALL_FULL_INCLUDEDIR})
 configure_file(cmake/tessalutility.pc.in ${PROJECT_BINARY_DIR}/tessalutility.pc @ONLY)
 install(FILES ${PROJECT_BINARY_DIR}/tessalutility.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig
         COMPONENT development)

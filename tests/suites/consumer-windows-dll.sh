@@ -1,0 +1,16 @@
+#!/usr/bin/env bash
+# about: a 64-bit Windows program uses the DLL, under Wine
+# needs: g++-mingw-w64-x86-64-posix=x86_64-w64-mingw32-g++-posix wine64=/usr/lib/wine/wine64
+# limit: 600
+set -euo pipefail
+source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
+source "$(dirname "${BASH_SOURCE[0]}")/lib/consumer.sh"
+
+toolchain=-DCMAKE_TOOLCHAIN_FILE=$root/cmake/mingw-w64.cmake
+install_library "$toolchain" -DBUILD_SHARED_LIBS=ON
+for file in bin/libTessalUtility.dll lib/libTessalUtility.dll.a; do
+    [ -f "$installed/$file" ] || { echo "$file is not installed." >&2; exit 1; }
+done
+# Windows looks for a DLL beside the program.
+mkdir -p "$work/consumer"
+build_consumer "$toolchain" -DCMAKE_FIND_ROOT_PATH="$installed" -DCMAKE_RUNTIME_OUTPUT_DIRECTORY="$installed/bin"

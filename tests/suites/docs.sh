@@ -1,0 +1,18 @@
+#!/usr/bin/env bash
+# about: the reference builds without a warning, and links between pages lead somewhere
+# needs: doxygen=doxygen
+# limit: 300
+set -euo pipefail
+source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
+
+step "doxygen" bash -c "cd '$root' && doxygen docs/Doxyfile"
+
+broken=0
+cd "$root"
+for page in *.md docs/*.md; do
+    # Links to files of this tree only: no scheme, no place within the same page.
+    for link in $(grep -oE '\]\([^)#: ]+' "$page" | cut -c3-); do
+        [ -e "$(dirname "$page")/$link" ] || { echo "$page: no such file: $link" >&2; broken=1; }
+    done
+done
+exit $broken

@@ -1,0 +1,9 @@
+#!/usr/bin/env bash
+# about: unit tests, optimised build by g++
+# needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h
+# limit: 900
+set -euo pipefail
+source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
+
+build release
+run_tests "$root/build/release"
