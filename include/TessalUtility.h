@@ -3,6 +3,7 @@
 #pragma once
 
 // One line a header, sorted.
+#include "BitOperations.h"
 #include "DebugTrace.h"
 #include "HkEnv.h"
 #include "HkException.h"
@@ -10,5 +11,7 @@
 #include "HkStr.h"
 #include "HkStream.h"
 #include "HkString.h"
+#include "LRBitVec.h"
+#include "RLBitVec.h"
 #include "TessalException.h"
 #include "TessalExport.h"
