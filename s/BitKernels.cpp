@@ -1,0 +1,405 @@
+#include "s/BitKernels.h"
+
+#include <functional>
+
+#include "s/WideVectors.h"
+
+namespace BitKernels {
+
+namespace {
+
+/// A run taken apart: bits in a first byte that is not whole, whole bytes, bits in a last byte that is not whole. A
+/// run inside one byte that does not reach the byte's end has a first part only.
+struct Run {
+    Run(std::size_t first, std::size_t count) {
+        const std::size_t skipped = first & 7;
+        if (skipped != 0) {
+            headBits = count < 8 - skipped ? count : 8 - skipped;
+            headMask = static_cast<unsigned char>(lowMask(headBits) << skipped);
+        }
+        headByte = first >> 3;
+        firstWhole = (first + 7) >> 3;
+        wholeBytes = (count - headBits) >> 3;
+        tailByte = firstWhole + wholeBytes;
+        tailBits = (count - headBits) & 7;
+        tailMask = static_cast<unsigned char>(lowMask(tailBits));
+    }
+
+    std::size_t headByte = 0;
+    std::size_t headBits = 0;
+    std::size_t firstWhole = 0;
+    std::size_t wholeBytes = 0;
+    std::size_t tailByte = 0;
+    std::size_t tailBits = 0;
+    unsigned char headMask = 0;
+    unsigned char tailMask = 0;
+};
+
+void setMasked(unsigned char& byte, unsigned char mask, unsigned value) {
+    byte = static_cast<unsigned char>((byte & ~mask) | (value & mask));
+}
+
+/// Up to eight bytes as a number, the first one least significant.
+Word loadPart(const unsigned char* bytes, std::size_t count) {
+    if (count >= sizeof(Word)) {
+        return loadWord(bytes);
+    }
+    Word word = 0;
+    for (std::size_t i = 0; i < count; ++i) {
+        word |= Word{bytes[i]} << (8 * i);
+    }
+    return word;
+}
+
+void storePart(unsigned char* bytes, std::size_t count, Word word) {
+    if (count >= sizeof(Word)) {
+        storeWord(bytes, word);
+        return;
+    }
+    for (std::size_t i = 0; i < count; ++i) {
+        bytes[i] = static_cast<unsigned char>(word >> (8 * i));
+    }
+}
+
+unsigned lowestBit(Word word) {
+    return static_cast<unsigned>(__builtin_ctzll(word));
+}
+
+// ---- Shifted copies of whole target bytes. The source run begins `shift` bits, 1 to 7, into its first byte, so a
+// ---- target unit at offset i is source[i] >> shift | source[i + 1] << (8 - shift), whatever the unit's width.
+
+TESSAL_INLINE_BODY Word shiftedWord(const unsigned char* source, unsigned shift) {
+    return loadWord(source) >> shift | loadWord(source + 1) << (8 - shift);
+}
+
+TESSAL_INLINE_BODY unsigned char shiftedByte(const unsigned char* source, unsigned shift) {
+    return static_cast<unsigned char>(source[0] >> shift | source[1] << (8 - shift));
+}
+
+/// One block; all of it is read before any of it is written.
+TESSAL_INLINE_BODY void copyShiftedBlock(unsigned char* target, const unsigned char* source, unsigned shift) {
+    Block low;
+    Block high;
+    std::memcpy(&low, source, sizeof low);
+    std::memcpy(&high, source + 1, sizeof high);
+    low = low >> shift | high << (8 - shift);
+    std::memcpy(target, &low, sizeof low);
+}
+
+TESSAL_INLINE_BODY void copyUpwards(unsigned char* target, const unsigned char* source, std::size_t count,
+                                    unsigned shift) {
+    std::size_t i = 0;
+    for (; i + blockBytes <= count; i += blockBytes) {
+        copyShiftedBlock(target + i, source + i, shift);
+    }
+    for (; i + sizeof(Word) <= count; i += sizeof(Word)) {
+        storeWord(target + i, shiftedWord(source + i, shift));
+    }
+    for (; i < count; ++i) {
+        target[i] = shiftedByte(source + i, shift);
+    }
+}
+
+TESSAL_INLINE_BODY void copyDownwards(unsigned char* target, const unsigned char* source, std::size_t count,
+                                      unsigned shift) {
+    std::size_t i = count;
+    for (; i >= blockBytes; i -= blockBytes) {
+        copyShiftedBlock(target + i - blockBytes, source + i - blockBytes, shift);
+    }
+    for (; i >= sizeof(Word); i -= sizeof(Word)) {
+        storeWord(target + i - sizeof(Word), shiftedWord(source + i - sizeof(Word), shift));
+    }
+    for (; i > 0; --i) {
+        target[i - 1] = shiftedByte(source + i - 1, shift);
+    }
+}
+
+using ShiftedCopy = void(unsigned char*, const unsigned char*, std::size_t, unsigned);
+
+void copyUpwardsPlain(unsigned char* target, const unsigned char* source, std::size_t count, unsigned shift) {
+    copyUpwards(target, source, count, shift);
+}
+TESSAL_WIDE void copyUpwardsWide(unsigned char* target, const unsigned char* source, std::size_t count,
+                                 unsigned shift) {
+    copyUpwards(target, source, count, shift);
+}
+void copyDownwardsPlain(unsigned char* target, const unsigned char* source, std::size_t count, unsigned shift) {
+    copyDownwards(target, source, count, shift);
+}
+TESSAL_WIDE void copyDownwardsWide(unsigned char* target, const unsigned char* source, std::size_t count,
+                                   unsigned shift) {
+    copyDownwards(target, source, count, shift);
+}
+
+/// Whole target bytes from any bit of the source, in the given direction.
+void copyWholeBytes(unsigned char* target, const unsigned char* source, std::size_t sourceFirst, std::size_t count,
+                    bool upwards) {
+    const auto shift = static_cast<unsigned>(sourceFirst & 7);
+    source += sourceFirst >> 3;
+    if (count == 0) {
+        return;
+    }
+    if (shift == 0) {
+        std::memmove(target, source, count);
+        return;
+    }
+    const bool wide = hasWideVectors();
+    ShiftedCopy* const copy =
+        upwards ? (wide ? copyUpwardsWide : copyUpwardsPlain) : (wide ? copyDownwardsWide : copyDownwardsPlain);
+    copy(target, source, count, shift);
+}
+
+// ---- Logic on whole bytes.
+
+enum class Logic { And, Or, Xor, Complement, Reverse };
+
+/// A value of any width combined; Reverse turns the bits of each byte round.
+template <Logic logic, class Value>
+TESSAL_INLINE_BODY void combineValue(Value& target, const Value& source) {
+    if constexpr (logic == Logic::And) {
+        target &= source;
+    } else if constexpr (logic == Logic::Or) {
+        target |= source;
+    } else if constexpr (logic == Logic::Xor) {
+        target ^= source;
+    } else if constexpr (logic == Logic::Complement) {
+        target = ~source;
+    } else {
+        target = (source >> 4 & 0x0F0F0F0F0F0F0F0FU) | (source & 0x0F0F0F0F0F0F0F0FU) << 4;
+        target = (target >> 2 & 0x3333333333333333U) | (target & 0x3333333333333333U) << 2;
+        target = (target >> 1 & 0x5555555555555555U) | (target & 0x5555555555555555U) << 1;
+    }
+}
+
+constexpr bool readsTarget(Logic logic) {
+    return logic == Logic::And || logic == Logic::Or || logic == Logic::Xor;
+}
+
+template <Logic logic>
+TESSAL_INLINE_BODY void combineBody(unsigned char* target, const unsigned char* source, std::size_t count) {
+    std::size_t i = 0;
+    for (; i + blockBytes <= count; i += blockBytes) {
+        Block mine{};
+        Block other;
+        if constexpr (readsTarget(logic)) {
+            std::memcpy(&mine, target + i, sizeof mine);
+        }
+        std::memcpy(&other, source + i, sizeof other);
+        combineValue<logic>(mine, other);
+        std::memcpy(target + i, &mine, sizeof mine);
+    }
+    for (; i < count; i += sizeof(Word)) {
+        const std::size_t left = count - i;
+        Word mine = readsTarget(logic) ? loadPart(target + i, left) : 0;
+        combineValue<logic>(mine, loadPart(source + i, left));
+        storePart(target + i, left, mine);
+    }
+}
+
+template <Logic logic>
+TESSAL_WIDE void combineWide(unsigned char* target, const unsigned char* source, std::size_t count) {
+    combineBody<logic>(target, source, count);
+}
+
+template <Logic logic>
+void combine(unsigned char* target, const unsigned char* source, std::size_t count) {
+    if (hasWideVectors()) {
+        combineWide<logic>(target, source, count);
+    } else {
+        combineBody<logic>(target, source, count);
+    }
+}
+
+// ---- Searching and counting in whole bytes.
+
+/// The number of leading bytes, in steps of blocks, that all equal the filler.
+TESSAL_INLINE_BODY std::size_t skipBody(const unsigned char* bytes, std::size_t count, Word filler) {
+    const Block fill = {filler, filler, filler, filler};
+    std::size_t i = 0;
+    for (; i + 2 * blockBytes <= count; i += 2 * blockBytes) {
+        Block a;
+        Block b;
+        std::memcpy(&a, bytes + i, sizeof a);
+        std::memcpy(&b, bytes + i + blockBytes, sizeof b);
+        a = (a ^ fill) | (b ^ fill);
+        if ((a[0] | a[1] | a[2] | a[3]) != 0) {
+            break;
+        }
+    }
+    return i;
+}
+
+TESSAL_WIDE std::size_t skipWide(const unsigned char* bytes, std::size_t count, Word filler) {
+    return skipBody(bytes, count, filler);
+}
+
+std::size_t skip(const unsigned char* bytes, std::size_t count, Word filler) {
+    return hasWideVectors() ? skipWide(bytes, count, filler) : skipBody(bytes, count, filler);
+}
+
+}  // namespace
+
+Word readBits(const unsigned char* bytes, std::size_t first, std::size_t count) {
+    if (count == 0) {
+        return 0;
+    }
+    bytes += first >> 3;
+    const std::size_t skipped = first & 7;
+    const std::size_t held = (skipped + count + 7) >> 3;
+    Word word = loadPart(bytes, held) >> skipped;
+    if (held > sizeof(Word)) {
+        word |= Word{bytes[sizeof(Word)]} << (wordBits - skipped);
+    }
+    return word & lowMask(count);
+}
+
+void writeBits(unsigned char* bytes, std::size_t first, std::size_t count, Word value) {
+    if (count == 0) {
+        return;
+    }
+    bytes += first >> 3;
+    const std::size_t skipped = first & 7;
+    const std::size_t held = (skipped + count + 7) >> 3;
+    const Word mask = lowMask(count);
+    value &= mask;
+    storePart(bytes, held, (loadPart(bytes, held) & ~(mask << skipped)) | value << skipped);
+    if (held > sizeof(Word)) {
+        setMasked(bytes[sizeof(Word)], static_cast<unsigned char>(mask >> (wordBits - skipped)),
+                  static_cast<unsigned>(value >> (wordBits - skipped)));
+    }
+}
+
+void copyBits(unsigned char* target, std::size_t targetFirst, const unsigned char* source, std::size_t sourceFirst,
+              std::size_t count) {
+    if (count <= wordBits) {
+        writeBits(target, targetFirst, count, readBits(source, sourceFirst, count));
+        return;
+    }
+    const Run run(targetFirst, count);
+    const std::size_t wholeFirst = sourceFirst + run.headBits;
+    const std::size_t tailFirst = wholeFirst + 8 * run.wholeBytes;
+    const auto copyHead = [&] {
+        writeBits(target, targetFirst, run.headBits, readBits(source, sourceFirst, run.headBits));
+    };
+    const auto copyTail = [&] {
+        writeBits(target, 8 * run.tailByte, run.tailBits, readBits(source, tailFirst, run.tailBits));
+    };
+    // Towards lower addresses the copy begins at the low end, otherwise at the high end, so that nothing is
+    // overwritten before it is read.
+    const unsigned char* const targetByte = target + (targetFirst >> 3);
+    const unsigned char* const sourceByte = source + (sourceFirst >> 3);
+    const bool upwards =
+        targetByte == sourceByte ? (targetFirst & 7) <= (sourceFirst & 7) : std::less<>()(targetByte, sourceByte);
+    unsigned char* const whole = target + run.firstWhole;
+    if (upwards) {
+        copyHead();
+        copyWholeBytes(whole, source, wholeFirst, run.wholeBytes, true);
+        copyTail();
+    } else {
+        copyTail();
+        copyWholeBytes(whole, source, wholeFirst, run.wholeBytes, false);
+        copyHead();
+    }
+}
+
+void fillBits(unsigned char* bytes, std::size_t first, std::size_t count, bool value) {
+    const Run run(first, count);
+    const unsigned fill = value ? 0xFF : 0x00;
+    if (run.headBits != 0) {
+        setMasked(bytes[run.headByte], run.headMask, fill);
+    }
+    if (run.wholeBytes != 0) {
+        std::memset(bytes + run.firstWhole, static_cast<int>(fill), run.wholeBytes);
+    }
+    if (run.tailBits != 0) {
+        setMasked(bytes[run.tailByte], run.tailMask, fill);
+    }
+}
+
+bool equalBits(const unsigned char* a, const unsigned char* b, std::size_t first, std::size_t count) {
+    const Run run(first, count);
+    if (run.headBits != 0 && ((a[run.headByte] ^ b[run.headByte]) & run.headMask) != 0) {
+        return false;
+    }
+    if (run.tailBits != 0 && ((a[run.tailByte] ^ b[run.tailByte]) & run.tailMask) != 0) {
+        return false;
+    }
+    return run.wholeBytes == 0 || std::memcmp(a + run.firstWhole, b + run.firstWhole, run.wholeBytes) == 0;
+}
+
+std::size_t findBit(const unsigned char* bytes, std::size_t first, std::size_t count, bool value) {
+    const Run run(first, count);
+    const Word filler = value ? 0 : ~Word{0};
+    if (run.headBits != 0) {
+        const Word found = (bytes[run.headByte] ^ filler) & run.headMask;
+        if (found != 0) {
+            return 8 * run.headByte + lowestBit(found);
+        }
+    }
+    std::size_t i = run.firstWhole + skip(bytes + run.firstWhole, run.wholeBytes, filler);
+    for (; i < run.tailByte; i += sizeof(Word)) {
+        const std::size_t left = run.tailByte - i;
+        const Word found = (loadPart(bytes + i, left) ^ filler) & lowMask(8 * left);
+        if (found != 0) {
+            return 8 * i + lowestBit(found);
+        }
+    }
+    if (run.tailBits != 0) {
+        const Word found = (bytes[run.tailByte] ^ filler) & run.tailMask;
+        if (found != 0) {
+            return 8 * run.tailByte + lowestBit(found);
+        }
+    }
+    return first + count;
+}
+
+std::size_t countOnes(const unsigned char* bytes, std::size_t first, std::size_t count) {
+    std::size_t ones = 0;
+    for (std::size_t done = 0; done < count; done += wordBits) {
+        const std::size_t part = count - done < wordBits ? count - done : wordBits;
+        ones += static_cast<std::size_t>(__builtin_popcountll(readBits(bytes, first + done, part)));
+    }
+    return ones;
+}
+
+std::size_t hashBits(const unsigned char* bytes, std::size_t first, std::size_t count) {
+    constexpr Word multiplier = 0x9E3779B97F4A7C15U;
+    Word hash = (count + 1) * multiplier;
+    for (std::size_t done = 0; done < count; done += wordBits) {
+        const std::size_t part = count - done < wordBits ? count - done : wordBits;
+        hash = (hash ^ readBits(bytes, first + done, part)) * multiplier;
+        hash ^= hash >> 29;
+    }
+    return hash;
+}
+
+void andBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
+    combine<Logic::And>(target, source, count);
+}
+
+void orBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
+    combine<Logic::Or>(target, source, count);
+}
+
+void xorBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
+    combine<Logic::Xor>(target, source, count);
+}
+
+void complementBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
+    combine<Logic::Complement>(target, source, count);
+}
+
+void reverseBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
+    combine<Logic::Reverse>(target, source, count);
+}
+
+Word reverseBits(Word value, std::size_t count) {
+    if (count == 0) {
+        return 0;
+    }
+    Word reversed = 0;
+    combineValue<Logic::Reverse>(reversed, value);
+    return __builtin_bswap64(reversed) >> (wordBits - count);
+}
+
+}  // namespace BitKernels

@@ -1,0 +1,34 @@
+// 32-byte vectors behind a check at run time.
+//
+// A kernel's body is written once, on Block values, as a TESSAL_INLINE_BODY function. It is compiled twice: into a
+// plain function, where the compiler splits each block into what the build's processor has, and into one marked
+// TESSAL_WIDE. The public function picks one by hasWideVectors().
+//
+// MinGW's g++ cannot keep 32-byte values aligned on the stack, so there both are the plain one.
+#pragma once
+
+#include <cstdint>
+#include <cstring>
+
+#if defined(__x86_64__) && !defined(__MINGW32__)
+#define TESSAL_WIDE __attribute__((target("avx2")))
+#define TESSAL_HAS_WIDE 1
+#else
+#define TESSAL_WIDE
+#define TESSAL_HAS_WIDE 0
+#endif
+
+#define TESSAL_INLINE_BODY inline __attribute__((always_inline))
+
+/// Four words that are worked on side by side.
+using Block = std::uint64_t __attribute__((vector_size(32)));
+constexpr std::size_t blockBytes = sizeof(Block);
+
+/// True when the processor has what functions marked TESSAL_WIDE need.
+inline bool hasWideVectors() {
+#if TESSAL_HAS_WIDE
+    return __builtin_cpu_supports("avx2") != 0;
+#else
+    return false;
+#endif
+}
