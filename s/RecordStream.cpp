@@ -70,7 +70,11 @@ void RecordWriter::addInt(int value) {
 void RecordWriter::addText(const char* text) {
     const std::string_view view(text != nullptr ? text : "");
     addInt(static_cast<int>(view.size()));
-    m_form.append(view);
+    addLine(view.data());
+}
+
+void RecordWriter::addLine(const char* text) {
+    m_form.append(text);
     m_form.push_back('\n');
 }
 

@@ -13,6 +13,8 @@ public:
     void addInt(int value);
     /// Null counts as the empty text.
     void addText(const char* text);
+    /// The text alone, without its length, and a line feed.
+    void addLine(const char* text);
     void writeTo(std::ostream& out) const;
 
 private:

@@ -1,0 +1,76 @@
+#include "DataBuffer.h"
+
+#include <cstring>
+#include <limits>
+#include <utility>
+
+#include "HkMemory.h"
+#include "HkMessageManager.h"
+#include "HkStr.h"
+
+namespace {
+
+constexpr int growthMargin = 1024;
+
+}  // namespace
+
+DataBuffer::DataBuffer(int size) {
+    if (size > 0) {
+        m_data = static_cast<char*>(hk_malloc(static_cast<std::size_t>(size)));
+        m_capacity = m_data != nullptr ? size : 0;
+    }
+}
+
+DataBuffer::DataBuffer(const DataBuffer& other) : DataBuffer(other.m_capacity) {
+    if (m_capacity > 0) {
+        std::memcpy(m_data, other.m_data, static_cast<std::size_t>(m_capacity));
+        m_position = other.m_position;
+    }
+}
+
+DataBuffer& DataBuffer::operator=(const DataBuffer& other) {
+    DataBuffer copy(other);
+    std::swap(m_position, copy.m_position);
+    std::swap(m_capacity, copy.m_capacity);
+    std::swap(m_data, copy.m_data);
+    return *this;
+}
+
+DataBuffer::~DataBuffer() {
+    hk_free(m_data);
+}
+
+void DataBuffer::write(const char* data, int length) {
+    if (data != nullptr && length > 0 && hasSpace(length)) {
+        std::memcpy(m_data + m_position, data, static_cast<std::size_t>(length));
+        m_position += length;
+    }
+}
+
+void DataBuffer::writeString(const char* text) {
+    constexpr std::size_t longest = std::numeric_limits<int>::max();
+    const std::size_t length = HkStr::Len(text);
+    if (length > longest) {
+        HkMessageManager::debugStub("Error reallocating space in DataBuffer.\n");
+        return;
+    }
+    writeInt(static_cast<int>(length));
+    write(text, static_cast<int>(length));
+}
+
+void DataBuffer::checkBufferSpace(int requested) {
+    const std::int64_t needed = std::int64_t{m_position} + requested;
+    if (needed <= m_capacity) {
+        return;
+    }
+    const std::int64_t capacity = std::int64_t{m_capacity} + requested + growthMargin;
+    void* const grown =
+        capacity <= std::numeric_limits<int>::max() ? hk_realloc(m_data, static_cast<std::size_t>(capacity)) : nullptr;
+    if (grown == nullptr) {
+        HkMessageManager::debugStub("Error reallocating space in DataBuffer.\n");
+        return;
+    }
+    m_data = static_cast<char*>(grown);
+    m_capacity = static_cast<int>(capacity);
+    HkMessageManager::debugStub("New buffer size = %d. Requested size = %d.\n", m_capacity, static_cast<int>(needed));
+}

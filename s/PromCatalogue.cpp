@@ -1,0 +1,142 @@
+// The catalogue half of PromUtility.
+
+#include <algorithm>
+#include <iterator>
+#include <optional>
+
+#include "HkStr.h"
+#include "ProfileConfig.h"
+#include "ProfileKeyTable.h"
+#include "PromUtility.h"
+#include "TessalException.h"
+#include "s/PromUtilityOrigin.h"
+
+namespace {
+
+using DeviceProfile::ProfileConfig;
+using PartList = std::vector<promPartAndSizePair>;
+
+struct Catalogue {
+    bool isRead = false;
+    PartList standard;
+    PartList extended;
+};
+
+/// Made at the first use and never destroyed, so that it serves other units before and behind main.
+Catalogue& catalogue() {
+    static Catalogue& instance = *new Catalogue;
+    return instance;
+}
+
+/// The rows of `PROM_DEVICES` in one data file.
+class PartTable {
+public:
+    PartTable(const char* dataFile, ProfileConfig& selection) : m_table(dataFile, &selection, 1, 1, 1) {}
+
+    /// Null past the last row.
+    const char* name(short row) { return cell(row, 0); }
+    /// Null where the row has no size.
+    const char* size(short row) { return cell(row, 1); }
+
+private:
+    const char* cell(short row, short field) { return m_table.getstringbykey("PROM_DEVICES", ":", row, ",", field); }
+
+    ProfileKeyTable m_table;
+};
+
+void readParts(const char* dataFile, ProfileConfig& selection, PartList& parts) {
+    PartTable table(dataFile, selection);
+    for (short row = 0;; ++row) {
+        const HkString name(table.name(row));
+        if (name.IsEmpty()) {
+            return;
+        }
+        parts.push_back({name, HkString(table.size(row))});
+    }
+}
+
+constexpr int notListed = -1;
+
+/// The size of the first row of that name; none where there is no such row.
+std::optional<int> findSize(const char* dataFile, ProfileConfig& selection, const char* part) {
+    PartTable table(dataFile, selection);
+    for (short row = 0; const char* const name = table.name(row); ++row) {
+        if (HkStr::ICompare(name, part) == 0) {
+            const char* const size = table.size(row);
+            if (size == nullptr) {
+                promUtilityOrigin.raise<OutOfRangeException>();
+            }
+            return HkStr::AToL(size);
+        }
+    }
+    return std::nullopt;
+}
+
+bool matches(const char* name, const char* pattern) {
+    return HkStr::IMatch(name, pattern) != 0;
+}
+
+struct Family {
+    const char* name;
+    bool (*holds)(const char* part);
+};
+
+// The families overlap: a part may belong to several, or to none.
+constexpr Family families[] = {
+    {"legacy", [](const char* part) { return matches(part, "zq73*"); }},
+    {"zqr", [](const char* part) { return matches(part, "zqr*"); }},
+    {"version", [](const char* part) { return matches(part, "zqr*p"); }},
+    {"bpi", [](const char* part) { return matches(part, "zqr*x"); }},
+    {"parallel",
+     [](const char* part) { return !matches(part, "zq*") && (matches(part, "*m") || matches(part, "*k")); }},
+};
+
+PartList filterParts(const PartList& parts, const char* familyName) {
+    PartList result;
+    for (const Family& family : families) {
+        if (HkStr::ICompare(family.name, familyName) == 0) {
+            std::copy_if(parts.begin(), parts.end(), std::back_inserter(result),
+                         [&family](const promPartAndSizePair& part) { return family.holds(part.partName); });
+        }
+    }
+    return result;
+}
+
+}  // namespace
+
+bool PromUtility::readPromList() {
+    Catalogue& lists = catalogue();
+    if (!lists.isRead) {
+        lists.isRead = true;
+        ProfileConfig selection("base", 1, ProfilePartBinding(1));
+        readParts("proms.acd", selection, lists.standard);
+        readParts("tessal.acd", selection, lists.extended);
+    }
+    return true;
+}
+
+std::vector<promPartAndSizePair> PromUtility::GetPromList() {
+    readPromList();
+    return catalogue().standard;
+}
+
+std::vector<promPartAndSizePair> PromUtility::GetExtendedPromList() {
+    readPromList();
+    return catalogue().extended;
+}
+
+std::vector<promPartAndSizePair> PromUtility::GetSpecificPromList(const char* family) {
+    readPromList();
+    return filterParts(catalogue().standard, family);
+}
+
+int PromUtility::GetPromSizeByName(const char* part) {
+    ProfileConfig selection("base", 1, ProfilePartBinding(0));
+    return findSize("proms.dat", selection, part).value_or(notListed);
+}
+
+int PromUtility::GetExtendedPromSizeByName(const char* part) {
+    ProfileConfig selection("base", 1, ProfilePartBinding(0));
+    const std::optional<int> size = findSize("proms.acd", selection, part);
+    return size ? *size : findSize("tessal.acd", selection, part).value_or(notListed);
+}

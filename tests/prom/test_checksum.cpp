@@ -1,0 +1,172 @@
+// Row checksums: the arithmetic against a bit-by-bit sum, the fill, the verdicts and the dump.
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <memory>
+#include <random>
+#include <string>
+#include <vector>
+
+#include "MessageRecorder.h"
+#include "PromUtility.h"
+#include "s/ByteSum.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+class Mirrored : public RLBitVec {
+public:
+    explicit Mirrored(const RLBitVec& other) : RLBitVec(other) { m_byteMirrorIndex = 1; }
+};
+
+RLBitVec randomVector(std::mt19937& random, std::size_t length) {
+    RLBitVec vector(length);
+    for (std::size_t i = 0; i < length; ++i) {
+        if (random() % 2 != 0) {
+            vector.setBit(i);
+        }
+    }
+    return vector;
+}
+
+int plainSum(const RLBitVec& row, int bits) {
+    unsigned int sum = 0;
+    for (int i = bits - 1; i >= 0; i -= 8) {
+        for (int k = 0; k < 8; ++k) {
+            sum += row.testBit(static_cast<std::size_t>(i - k)) ? 1U << k : 0U;
+        }
+    }
+    return static_cast<int>(sum);
+}
+
+struct Sums {
+    int file = 0;
+    int device = 0;
+};
+
+/// One row for both sides; the text of the last row, empty otherwise.
+std::string addRow(Sums& sums, RLBitVec& row, int bits, bool last = false, int done = 0, int total = 0) {
+    const std::unique_ptr<char[]> text(
+        PromUtility::rowChecksum(0, &row, bits, &row, bits, last, sums.file, sums.device, done, total));
+    return text != nullptr ? text.get() : "";
+}
+
+TEST(RowChecksum, ARowIsReadFromItsHighestIndexDown) {
+    RLBitVec row(8);
+    row.setBit(7);
+    Sums sums;
+    EXPECT_EQ(addRow(sums, row, 8), "");
+    EXPECT_EQ(sums.file, 1);
+    row.clearBit(7);
+    row.setBit(0);
+    addRow(sums, row, 8);
+    EXPECT_EQ(sums.device, 129);
+}
+
+TEST(RowChecksum, EqualsTheSumBitByBitInAnyNumbering) {
+    std::mt19937 random(20261124);
+    for (int bits : {8, 16, 64, 72, 1000, 1024, 4096, 10008}) {
+        for (int longer : {0, 1, 8, 13}) {
+            SCOPED_TRACE(testing::Message() << bits << " bits of a vector " << longer << " longer");
+            RLBitVec row = randomVector(random, static_cast<std::size_t>(bits + longer));
+            Sums sums{5, -5};
+            addRow(sums, row, bits);
+            EXPECT_EQ(sums.file, 5 + plainSum(row, bits));
+            EXPECT_EQ(sums.device, -5 + plainSum(row, bits));
+            if (bits % 8 == 0 && longer % 8 == 0) {
+                Mirrored mirrored(row);
+                Sums mirroredSums;
+                addRow(mirroredSums, mirrored, bits);
+                EXPECT_EQ(mirroredSums.file, plainSum(mirrored, bits));
+            }
+        }
+    }
+}
+
+TEST(RowChecksum, ByteSumsAgreeAtEveryLength) {
+    std::vector<unsigned char> bytes(700, 0xFF);
+    for (std::size_t count = 0; count <= bytes.size(); ++count) {
+        ASSERT_EQ(sumBytes(bytes.data(), count), 255 * count);
+        ASSERT_EQ(sumBytesPortably(bytes.data(), count), 255 * count);
+    }
+}
+
+TEST(RowChecksum, TheLastRowFillsTheRestAndGivesTheDeviceSum) {
+    RLBitVec row(8);
+    Sums sums;
+    const MessageRecorder messages;
+    EXPECT_EQ(addRow(sums, row, 8, true, 16, 40), "0000001fe");
+    EXPECT_EQ(sums.file, 510);
+    EXPECT_THAT(messages.status(), ElementsAre("Calculated checksum matches expected checksum, 0000001fe\n"));
+    addRow(sums, row, 8, true, 32, 40);
+    EXPECT_EQ(sums.file, 510) << "nothing left to fill";
+    addRow(sums, row, 8, true, 32, 41);
+    EXPECT_EQ(sums.file, 765) << "a part of a byte counts whole";
+    sums = {-1, 0};
+    addRow(sums, row, 0, true, 0, 2147483647);
+    EXPECT_EQ(static_cast<unsigned int>(sums.device), 255U * 268435456U);
+    EXPECT_EQ(static_cast<unsigned int>(sums.file), 255U * 268435456U - 1U);
+}
+
+TEST(RowChecksum, VerdictsAreReported) {
+    RLBitVec none(0);
+    struct Case {
+        Sums sums;
+        const char* status;
+        const char* error;
+    };
+    const Case cases[] = {
+        {{0, 255}, "Device checksum is  0000000ff\n", nullptr},
+        {{0, 0}, "Device checksum is  000000000\n", nullptr},
+        {{-1, -1}, "Calculated checksum matches expected checksum, 0ffffffff\n", nullptr},
+        {{2, 1}, nullptr, "The calculated checksum (0x00000001) differs from the expected checksum (0x00000002).\n"}};
+    for (Case c : cases) {
+        const MessageRecorder messages;
+        addRow(c.sums, none, 0, true);
+        EXPECT_EQ(messages.all().size(), 1U);
+        EXPECT_EQ(messages.status(),
+                  c.status != nullptr ? std::vector<std::string>{c.status} : std::vector<std::string>());
+        EXPECT_EQ(messages.errors(),
+                  c.error != nullptr ? std::vector<std::string>{c.error} : std::vector<std::string>());
+    }
+    Sums sums;
+    EXPECT_EQ(PromUtility::rowChecksum(0, nullptr, 8, nullptr, 8, false, sums.file, sums.device, 0, 0), nullptr);
+    EXPECT_EQ(sums.file, 0);
+}
+
+void setVariable(const char* name, const char* value) {
+#if defined(_WIN32)
+    _putenv_s(name, value != nullptr ? value : "");
+#else
+    value != nullptr ? setenv(name, value, 1) : unsetenv(name);
+#endif
+}
+
+TEST(RowChecksum, TheDumpShowsTheFilesBitsAndTheFill) {
+    constexpr const char* variable = "ZRX_TESSAL_ZQ7300DUMPCHECKSUMDATA";
+    RLBitVec row(8);
+    row.setBit(7);
+    row.setBit(5);
+    Sums sums;
+    const MessageRecorder messages;
+    addRow(sums, row, 8);
+    EXPECT_THAT(messages.all(), IsEmpty());
+    setVariable(variable, "0");
+    testing::internal::CaptureStdout();
+    addRow(sums, row, 8, true, 0, 24);
+    const std::string console = testing::internal::GetCapturedStdout();
+    setVariable(variable, nullptr);
+    EXPECT_EQ(console,
+              "Current Size 8File Checksum is 10Device Checksum is 10\n"
+              "Current Size 16File Checksum is 265Device Checksum is 265\n");
+    ASSERT_EQ(messages.status().size(), 9U);
+    EXPECT_EQ(messages.status()[0], "File Checksum is 6, i is 6\n");
+    EXPECT_EQ(messages.status()[2], "File Checksum is a, i is 4\n");
+    EXPECT_EQ(messages.status()[7], "File Checksum is a, i is -1\n");
+}
+
+}  // namespace
