@@ -4,6 +4,7 @@
 
 // One line a header, sorted.
 #include "DebugTrace.h"
+#include "HkCmdArgs.h"
 #include "HkEnv.h"
 #include "HkException.h"
 #include "HkMessageManager.h"
