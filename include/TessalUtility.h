@@ -11,6 +11,7 @@
 #include "FileUtility.h"
 #include "HkDir.h"
 #include "DeviceOptionsMgr.h"
+#include "HkCmdArgs.h"
 #include "HkEnv.h"
 #include "HkException.h"
 #include "HkFile.h"
