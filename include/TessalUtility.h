@@ -30,6 +30,7 @@
 #include "ProfileKeyTable.h"
 #include "NetString.h"
 #include "Streamable.h"
+#include "TessalCmdargs.h"
 #include "TessalException.h"
 #include "TessalExport.h"
 #include "TessalSmokeMgr.h"
