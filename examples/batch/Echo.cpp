@@ -4,6 +4,8 @@
 #include <array>
 #include <vector>
 
+#include "Quoting.h"
+
 namespace {
 
 constexpr std::size_t widestColumn = 36;
@@ -11,15 +13,10 @@ constexpr std::size_t widestColumn = 36;
 /// Name, values and meaning of one argument.
 using Row = std::array<std::string, 3>;
 
-std::string quotedWhereNeeded(const HkString& value) {
-    const bool isPlain = !value.IsEmpty() && value.GetIndexOfFirstChar(' ', '\t') == HkString::npos;
-    return isPlain ? value.c_str() : "\"" + std::string(value) + "\"";
-}
-
 std::string valuesOf(const HkCmdArgs& args, const char* name) {
     std::string text;
     for (const HkString& value : args.list(name)) {
-        text += (text.empty() ? "" : " ") + quotedWhereNeeded(value);
+        text += (text.empty() ? "" : " ") + quotedWhereNeeded(value.view());
     }
     return text;
 }

@@ -6,6 +6,7 @@
 
 #include "Echo.h"
 #include "Handlers.h"
+#include "Quoting.h"
 
 Session::Outcome Session::take(const std::string& line, int number) {
     m_messages.setLine(number);
@@ -53,14 +54,21 @@ bool Session::runCommand(CommandSet& commands) {
         TessalCmdargs::getCmdargs(commands.getNumberCommands(), commands.getCommands(), true));
     const Handler handler = findHandler(name);
     if (!m_isPrompt || handler == nullptr) {
-        std::printf("%5d  %s", m_number, echoOf(*args, format).c_str());
+        show(echoOf(*args, format));
     }
     return handler == nullptr || handler(*this, *args);
+}
+
+void Session::show(const std::string& echo) const {
+    if (!m_isPrompt) {
+        std::printf("%5d  ", m_number);
+    }
+    std::fputs(echo.c_str(), stdout);
 }
 
 void Session::sayUnknown(const char* word) const {
     const std::vector<HkString> known = TessalCmdargs::findAllCommands();
     const char* const nearest = HkCmdArgs::nearest(word, known);
-    const std::string text = "unknown command \"" + std::string(word) + "\"";
+    const std::string text = "unknown command " + quoted(word);
     m_messages.say(nearest != nullptr ? text + "; did you mean " + nearest + "?" : text);
 }

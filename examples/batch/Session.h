@@ -35,6 +35,7 @@ public:
 private:
     Outcome takeText(const std::string& text);
     bool runCommand(CommandSet& commands);
+    void show(const std::string& echo) const;
 
     Messages& m_messages;
     bool m_isPrompt;
