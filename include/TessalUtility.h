@@ -45,6 +45,7 @@
 #include "LRBitVec.h"
 #include "RLBitVec.h"
 #include "Register.h"
+#include "TessalCmdargs.h"
 #include "TessalException.h"
 #include "TessalExport.h"
 #include "TessalPipe.h"

@@ -1,0 +1,76 @@
+#include "Runner.h"
+
+#include <cstdio>
+#include <fstream>
+#include <iostream>
+
+#include "Completion.h"
+#include "LineSource.h"
+#include "Messages.h"
+#include "Session.h"
+
+namespace {
+
+Status summarise(const Session& session, int lines) {
+    using Outcome = Session::Outcome;
+    std::printf("%d lines: %d checked, %d refused as expected, %d refused\n", lines, session.count(Outcome::Done),
+                session.count(Outcome::RefusedAsExpected), session.count(Outcome::Refused));
+    return session.count(Outcome::Refused) == 0 ? AllFine : LinesRefused;
+}
+
+Status runLines(std::istream& stream, const std::string& name, bool stopOnError) {
+    Messages messages(name);
+    Session session(messages, false);
+    LineSource source(stream);
+    std::string line;
+    while (!session.hasEnded() && source.next(line)) {
+        if (session.take(line, source.number()) == Session::Outcome::Refused && stopOnError) {
+            break;
+        }
+    }
+    if (source.hasFailed()) {
+        messages.sayOfAll("cannot be read");
+        return CannotRun;
+    }
+    return summarise(session, source.number());
+}
+
+bool askForLine(LineSource& source, std::string& line) {
+    std::fputs("tessal> ", stdout);
+    std::fflush(stdout);
+    return source.next(line);
+}
+
+}  // namespace
+
+Status runScript(const std::string& script, bool stopOnError) {
+    if (script == "-") {
+        return runLines(std::cin, "standard input", stopOnError);
+    }
+    std::ifstream file(script, std::ios::binary);
+    if (!file) {
+        std::fprintf(stderr, "%s: cannot be read\n", script.c_str());
+        return CannotRun;
+    }
+    return runLines(file, script, stopOnError);
+}
+
+Status runPrompt(bool stopOnError) {
+    std::puts("help lists the commands, quit ends, a tab before Enter shows how the line can go on.");
+    Messages messages("");
+    Session session(messages, true);
+    LineSource source(std::cin);
+    std::string line;
+    while (!session.hasEnded() && askForLine(source, line)) {
+        std::string asked;
+        if (isCompletionQuery(line, asked)) {
+            std::fputs(completionsOf(asked).c_str(), stdout);
+        } else if (session.take(line, source.number()) == Session::Outcome::Refused && stopOnError) {
+            return LinesRefused;
+        }
+    }
+    if (!session.hasEnded()) {
+        std::puts("");
+    }
+    return AllFine;
+}

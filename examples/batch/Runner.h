@@ -1,0 +1,14 @@
+// Runs the lines of a script or of a person.
+#pragma once
+
+#include <string>
+
+/// Exit status of the program.
+enum Status { AllFine = 0, LinesRefused = 1, CannotRun = 2 };
+
+/// Runs a script, "-" being standard input, up to its end, the command that ends the run or, with @p stopOnError, the
+/// first line that is refused.
+Status runScript(const std::string& script, bool stopOnError);
+
+/// Asks a person for lines. Who types has seen each message, so lines that were refused do not count at the end.
+Status runPrompt(bool stopOnError);

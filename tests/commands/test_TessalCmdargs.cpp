@@ -1,0 +1,117 @@
+#include "TessalCmdargs.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "CommandSet.h"
+#include "DataPath.h"
+#include "MessageRecorder.h"
+#include "TessalException.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsSupersetOf;
+
+/// A data directory of its own, with these rows of commands, as long as it lives.
+class CommandData {
+public:
+    explicit CommandData(const std::string& rows) {
+        std::filesystem::create_directories(m_directory);
+        std::ofstream(m_directory / "tessal.acd") << "[base]\n" << rows << "\n";
+        DeviceProfile::setDataPath(m_directory.string().c_str());
+    }
+    ~CommandData() {
+        DeviceProfile::setDataPath(nullptr);
+        std::filesystem::remove_all(m_directory);
+    }
+    CommandData(const CommandData&) = delete;
+    CommandData& operator=(const CommandData&) = delete;
+
+private:
+    std::filesystem::path m_directory =
+        std::filesystem::path(testing::TempDir()) / testing::UnitTest::GetInstance()->current_test_info()->name();
+};
+
+std::unique_ptr<HkCmdArgs> parse(const char* line, bool strict) {
+    const std::unique_ptr<CommandSet> commands(CommandSet::string2CommandSet(line));
+    return std::unique_ptr<HkCmdArgs>(
+        TessalCmdargs::getCmdargs(commands->getNumberCommands(), commands->getCommands(), strict));
+}
+
+std::vector<std::string> matching(const char* prefix) {
+    std::vector<std::string> names;
+    for (const HkString& name : TessalCmdargs::findMatchingCommands(prefix)) {
+        names.emplace_back(name);
+    }
+    return names;
+}
+
+// The table lives as long as the process and only grows, so this case comes first.
+TEST(TessalCmdargs, IsLoadedByTheFirstCommandAndByNothingElse) {
+    const CommandData data("OTHER = x");
+    const MessageRecorder messages;
+    EXPECT_THROW(parse("b", true), ACDEntryNotFoundException) << "no key yet";
+    const CommandData later("COMMAND_FORMAT = b,TRUE,[-x]");
+    EXPECT_TRUE(TessalCmdargs::findAllCommands().empty());
+    EXPECT_STREQ(TessalCmdargs::findFormatString("b"), "");
+    EXPECT_TRUE(parse("b -x", true)->isGiven("-x"));
+    EXPECT_STREQ(TessalCmdargs::findFormatString("b"), "[-x]");
+    EXPECT_TRUE(messages.all().empty());
+}
+
+TEST(TessalCmdargs, ListsBatchCommandsByTheirBytes) {
+    const CommandData data("COMMAND_FORMAT = lb,TRUE,[-x]:la,true,[-y]:lB,TRUE,[-z]:lc,FALSE,[-w]:lb,TRUE,[-new]");
+    TessalCmdargs::createCommandMap();
+    EXPECT_THAT(matching("l"), ElementsAre("lB", "la", "lb"));
+    EXPECT_THAT(matching("LA"), ElementsAre("la"));
+    EXPECT_THAT(matching("lbx"), ElementsAre());
+    EXPECT_EQ(matching(nullptr), matching(""));
+    EXPECT_EQ(TessalCmdargs::findAllCommands().size(), matching("").size());
+    EXPECT_STREQ(TessalCmdargs::findBatchFormatString("lb"), "[-new]") << "the last row of a name holds";
+    EXPECT_STREQ(TessalCmdargs::findFormatString("LA"), "") << "looked up exactly";
+    EXPECT_STREQ(TessalCmdargs::findFormatString("lc"), "[-w]");
+    EXPECT_STREQ(TessalCmdargs::findBatchFormatString("lc"), "");
+    EXPECT_STREQ(TessalCmdargs::findFormatString(nullptr), "");
+    EXPECT_TRUE(parse("LC -w", true)->isGiven("-w")) << "the parser takes commands of every kind";
+}
+
+TEST(TessalCmdargs, KeepsTheRowsBeforeOneWithoutAFormat) {
+    const CommandData data("COMMAND_FORMAT = ka,TRUE,[-x]:kb,TRUE:kc,TRUE,[-x]");
+    EXPECT_THROW(TessalCmdargs::createCommandMap(), DataMismatchException);
+    EXPECT_THAT(matching("k"), ElementsAre("ka"));
+}
+
+TEST(TessalCmdargs, RefusesWhatDoesNotFit) {
+    const CommandData data("COMMAND_FORMAT = ra,TRUE,-x:rb,TRUE,");
+    TessalCmdargs::createCommandMap();
+    const MessageRecorder messages;
+    EXPECT_THROW(parse("ra", true), InvalidArgumentException);
+    EXPECT_FALSE(messages.info().empty());
+    EXPECT_NE(parse("ra", false)->iserror(), 0);
+    EXPECT_STREQ(parse("RA -x", false)->command(), "RA") << "the arguments are passed on unchanged";
+    EXPECT_THROW(parse("rb", false), ACDEntryNotFoundException) << "an empty format is none";
+    EXPECT_THROW(parse("unknown", false), ACDEntryNotFoundException);
+    EXPECT_THROW(TessalCmdargs::getCmdargs(0, nullptr, false), ACDEntryNotFoundException);
+    char* const noWord[] = {nullptr};
+    EXPECT_THROW(TessalCmdargs::getCmdargs(1, noWord, false), ACDEntryNotFoundException);
+}
+
+TEST(TessalCmdargs, TheShippedCommandsHaveSoundFormats) {
+    DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
+    TessalCmdargs::createCommandMap();
+    DeviceProfile::setDataPath(nullptr);
+    for (const HkString& name : TessalCmdargs::findAllCommands()) {
+        EXPECT_STREQ(HkCmdArgs::checkFormat(TessalCmdargs::findFormatString(name)), "") << name;
+    }
+    EXPECT_THAT(matching(""), IsSupersetOf({"setmode", "setcable", "identify", "assignfile", "program", "erase",
+                                            "verify", "readback", "checksum", "generate", "info", "help", "quit"}));
+}
+
+}  // namespace
