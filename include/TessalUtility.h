@@ -3,6 +3,7 @@
 #pragma once
 
 // One line a header, sorted.
+#include "Access.h"
 #include "DebugTrace.h"
 #include "HkEnv.h"
 #include "HkException.h"
