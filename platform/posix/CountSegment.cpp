@@ -74,6 +74,7 @@ Attachment::Outcome Attachment::attach(int identifier) {
     }
     if (state.shm_segsz != sizeof(CountSegment) || (state.shm_perm.mode & SHM_DEST) != 0) {
         detach();
+        OpenFailure::note("another program's segment has its key, or it was removed, see ipcs -m");
         return Outcome::NotOurs;
     }
     if (SystemV::keepFromChildren(address, sizeof(CountSegment)) == -1) {

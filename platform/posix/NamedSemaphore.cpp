@@ -118,11 +118,11 @@ PlatformSemaphore* settle(key_t key, key_t firstKey, const char* name, const Bir
     if (outcome == Attachment::Outcome::Absent) {
         outcome = attachment.attachByKey(key);
     }
-    if (outcome == Attachment::Outcome::Failed) {
+    if (outcome != Attachment::Outcome::Attached) {
         return nullptr;
     }
-    if (outcome != Attachment::Outcome::Attached || !attachment.wasAlone()) {
-        return refuse(notFound, "another program took or removed its segment just now");
+    if (!attachment.wasAlone()) {
+        return refuse(notFound, "another program attached its segment just now");
     }
     attachment.set(name, birth.initial, birth.maximum);
     return makeHandle(std::move(attachment), key, firstKey);
@@ -193,7 +193,8 @@ PlatformSemaphore* duplicate(PlatformSemaphore* handle) {
     }
     Attachment attachment;
     if (attachment.attachAgain(handle->attachment) != Attachment::Outcome::Attached) {
-        return refuse(invalidHandle, "its segment cannot be attached once more");
+        failureCode = invalidHandle;
+        return nullptr;
     }
     return makeHandle(std::move(attachment), handle->key, handle->firstKey);
 }
