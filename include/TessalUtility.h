@@ -13,6 +13,7 @@
 #include "DFCallback.h"
 #include "DataBuffer.h"
 #include "DataPath.h"
+#include "Access.h"
 #include "DebugTrace.h"
 #include "DeviceOptionsMgr.h"
 #include "FileUtility.h"

@@ -1,0 +1,63 @@
+#include "Port.h"
+
+#include <chrono>
+#include <functional>
+#include <iostream>
+#include <map>
+#include <stdexcept>
+
+#include "host/Role.h"
+
+namespace {
+
+using Operation = std::function<int(Access&)>;
+
+const std::map<std::string, Operation>& operations() {
+    static const std::map<std::string, Operation> table = {
+        {"lock", [](Access& access) { return static_cast<int>(access.lock()); }},
+        {"unlock", [](Access& access) { return static_cast<int>(access.unlock()); }},
+        {"clean", [](Access& access) { return static_cast<int>(access.cleanLock()); }},
+        {"inc", [](Access& access) { return access.incCount(); }},
+        {"dec", [](Access& access) { return access.decCount(); }},
+        {"clients", [](Access& access) { return access.getNormalizedCount(); }},
+    };
+    return table;
+}
+
+int usePort(const RoleArguments& arguments) {
+    Access access(std::stoi(arguments.at(0)), static_cast<Access::ACCESS_TYPE>(std::stoi(arguments.at(1))));
+    std::cout << "open" << std::endl;
+    for (std::string line; std::getline(std::cin, line) && line != "end";) {
+        std::cout << operations().at(line)(access) << std::endl;
+    }
+    return 0;
+}
+
+const Role portUser{"port user", &usePort};
+
+}  // namespace
+
+int freshPort() {
+    // A range of a thousand ids for each microsecond at which a test may start.
+    static const auto start = std::chrono::system_clock::now().time_since_epoch();
+    static const auto range = std::chrono::duration_cast<std::chrono::microseconds>(start).count() % 1000000;
+    static int next = static_cast<int>(range) * 1000 + 10000;
+    return ++next;
+}
+
+PortUser::PortUser(int port, Access::ACCESS_TYPE type)
+    : m_process("port user", {std::to_string(port), std::to_string(type)}) {
+    if (m_process.read() != "open") {
+        throw std::runtime_error("the child did not open its port");
+    }
+}
+
+int PortUser::end() {
+    m_process.write("end");
+    return m_process.wait();
+}
+
+bool isFree(int port) {
+    Access access(port, Access::SHARE);
+    return access.lock();
+}

@@ -1,0 +1,28 @@
+// Ports that no other test, and no other run of the tests at the same time, uses; and a process that works on one.
+#pragma once
+
+#include <string>
+
+#include "Access.h"
+#include "host/ChildProcess.h"
+
+/// An id of its own at each call.
+int freshPort();
+
+/// A process with one Access, which does what it is told by the lines "lock", "unlock", "clean", "inc", "dec" and
+/// "clients", and answers each with its result. It ends in order at "end".
+class PortUser {
+public:
+    explicit PortUser(int port, Access::ACCESS_TYPE type = Access::SHARE);
+
+    int ask(const char* operation) { return std::stoi(m_process.ask(operation)); }
+    void kill() { m_process.kill(); }
+    int end();
+    ChildProcess& process() { return m_process; }
+
+private:
+    ChildProcess m_process;
+};
+
+/// True if a new Access finds the port free and can take it, as it must where nobody else is.
+bool isFree(int port);

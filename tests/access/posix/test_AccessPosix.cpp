@@ -1,0 +1,332 @@
+// What can go wrong with a lock between processes on a POSIX host, one test a fault.
+#include <gmock/gmock.h>
+#include <grp.h>
+#include <gtest/gtest.h>
+#include <sched.h>
+#include <signal.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <chrono>
+#include <fstream>
+#include <functional>
+#include <iostream>
+#include <unordered_map>
+
+#include "../Port.h"
+#include "Access.h"
+#include "MessageRecorder.h"
+#include "StepHook.h"
+#include "host/Role.h"
+#include "platform/NamedSemaphore.h"
+#include "platform/posix/CountSegment.h"
+#include "platform/posix/NamedSemaphoreKeys.h"
+#include "platform/posix/SystemV.h"
+
+using StepHook::Action;
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+namespace {
+
+key_t keyOf(int port) {
+    return NamedSemaphore::keyOfName(("CableSharing" + std::to_string(port)).c_str());
+}
+
+/// True if the machine holds nothing of the port's semaphore: no segment and no set.
+bool isNothingLeft(int port) {
+    const key_t key = keyOf(port);
+    return ::shmget(key, 0, 0) == -1 && ::shmget(key + 1, 0, 0) == -1 && ::semget(key, 0, 0) == -1;
+}
+
+void openLockAndClose(int port) {
+    Access access(port, Access::SHARE);
+    access.lock();
+    access.unlock();
+}
+
+/// Runs the body in a forked child and gives its exit status, -1 if it ended by a signal.
+int inChild(const std::function<int()>& body) {
+    const pid_t child = ::fork();
+    if (child == 0) {
+        ::_exit(body());
+    }
+    int status = 0;
+    ::waitpid(child, &status, 0);
+    return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+}
+
+/// Opens, locks, gives back and closes a port, and is ended or stopped at one of the host calls on that way.
+const Role stepper{"stepper", [](const RoleArguments& arguments) {
+                       StepHook::arm(arguments.at(0) == "kill" ? Action::Kill : Action::Stop,
+                                     std::stoi(arguments.at(1)));
+                       std::cout << "started" << std::endl;
+                       openLockAndClose(std::stoi(arguments.at(2)));
+                       return 0;
+                   }};
+
+/// Forks while it holds the port. The child sleeps, executes another program or returns through the destructors.
+const Role forker{"forker", [](const RoleArguments& arguments) {
+                      const std::string& mode = arguments.at(0);
+                      const MessageRecorder silence;
+                      Access access(std::stoi(arguments.at(1)), Access::SHARE);
+                      access.lock();
+                      const pid_t child = ::fork();
+                      if (child == 0 && mode == "return") {
+                          return access.unlock() || access.cleanLock() || access.lock() ? 1 : 0;
+                      }
+                      if (child == 0) {
+                          ::alarm(60);
+                          return mode == "exec" ? ::execlp("sleep", "sleep", "60", nullptr) : ::pause();
+                      }
+                      int status = 0;
+                      if (mode == "return") {
+                          ::waitpid(child, &status, 0);
+                      }
+                      std::cout << (mode == "return" ? status : child) << std::endl;
+                      std::string line;
+                      std::getline(std::cin, line);
+                      return 0;
+                  }};
+
+std::chrono::milliseconds durationOf(const std::function<void()>& body) {
+    const auto start = std::chrono::steady_clock::now();
+    body();
+    return std::chrono::duration_cast<std::chrono::milliseconds>(std::chrono::steady_clock::now() - start);
+}
+
+}  // namespace
+
+TEST(AccessSteps, KilledAtEachHostCallLeavesAUsablePort) {
+    const int port = freshPort();
+    bool gotThrough = false;
+    for (int step = 1; !gotThrough && step < 100; ++step) {
+        ChildProcess child("stepper", {"kill", std::to_string(step), std::to_string(port)});
+        gotThrough = child.wait() == 0;
+        SCOPED_TRACE("step " + std::to_string(step));
+        ASSERT_TRUE(isFree(port));
+        ASSERT_TRUE(isNothingLeft(port));
+    }
+    EXPECT_TRUE(gotThrough);
+}
+
+TEST(AccessSteps, KilledAtEachHostCallLeavesTheCountToThoseWhoRemain) {
+    const int port = freshPort();
+    bool gotThrough = false;
+    for (int step = 1; !gotThrough && step < 100; ++step) {
+        Access keeper(port, Access::SHARE);
+        ASSERT_TRUE(keeper.lock());
+        ChildProcess child("stepper", {"kill", std::to_string(step), std::to_string(port)});
+        gotThrough = child.wait() == 0;
+        SCOPED_TRACE("step " + std::to_string(step));
+        ASSERT_FALSE(isFree(port));
+        ASSERT_TRUE(keeper.unlock());
+        ASSERT_TRUE(isFree(port));
+    }
+    EXPECT_TRUE(gotThrough);
+    EXPECT_TRUE(isNothingLeft(port));
+}
+
+TEST(AccessSteps, StoppedInsideTheOpeningLockDelaysOthersForABoundedTime) {
+    const int port = freshPort();
+    ChildProcess stopped("stepper", {"stop", "6", std::to_string(port)});
+    ASSERT_EQ(stopped.read(), "started");
+    siginfo_t info{};
+    ASSERT_EQ(::waitid(P_PID, static_cast<id_t>(stopped.id()), &info, WSTOPPED), 0);
+    const MessageRecorder messages;
+    const auto duration = durationOf([&] { EXPECT_FALSE(Access(port, Access::SHARE).lock()); });
+    EXPECT_LT(duration, std::chrono::seconds(10));
+    EXPECT_THAT(messages.info(), ElementsAre(HasSubstr("process " + std::to_string(stopped.id()) + " stands still")));
+    ::kill(static_cast<pid_t>(stopped.id()), SIGCONT);
+    EXPECT_EQ(stopped.wait(), 0);
+    EXPECT_TRUE(isFree(port));
+    EXPECT_TRUE(isNothingLeft(port));
+}
+
+TEST(AccessSteps, EachHostCallMayFail) {
+    const int port = freshPort();
+    const char* const calls[] = {"shmget", "shmat", "shmctl(IPC_STAT)", "madvise", "semget", "semtimedop"};
+    for (const int error : {ENOSPC, EACCES, ENOMEM, ENOSYS}) {
+        for (const char* const call : calls) {
+            for (int step = 1; step <= 4; ++step) {
+                SCOPED_TRACE(std::string(call) + " " + std::to_string(step) + " " + std::to_string(error));
+                const MessageRecorder messages;
+                {
+                    StepHook::arm(Action::Fail, step, call, error);
+                    Access access(port, Access::SHARE);
+                    const bool opened = messages.info().empty();
+                    EXPECT_EQ(access.lock(), opened);
+                    EXPECT_TRUE(opened || messages.info().front().find(call) != std::string::npos)
+                        << messages.info().front();
+                    StepHook::disarm();
+                }
+                ASSERT_TRUE(isFree(port));
+            }
+        }
+    }
+    EXPECT_TRUE(isNothingLeft(port));
+}
+
+TEST(AccessFork, ChildNeitherGivesBackNorTakes) {
+    const int port = freshPort();
+    Access access(port, Access::SHARE);
+    ASSERT_TRUE(access.lock());
+    const MessageRecorder silence;
+    const int status = inChild([&] {
+        Access copy(access);
+        Access own(port, Access::SHARE);
+        const bool isInert = !access.unlock() && !access.cleanLock() && !access.lock() && !copy.lock() && !own.lock();
+        access.~Access();  // the parent's object ends here; the child goes on without it
+        return isInert && own.cleanLock() && own.lock() ? 0 : 1;  // which its destructor gives back
+    });
+    EXPECT_EQ(status, 0);
+    EXPECT_TRUE(access.lock());
+}
+
+TEST(AccessFork, ChildDoesNotKeepThePortOfItsKilledParent) {
+    for (const char* const mode : {"sleep", "exec"}) {
+        SCOPED_TRACE(mode);
+        const int port = freshPort();
+        ChildProcess parent("forker", {mode, std::to_string(port)});
+        const pid_t child = std::stoi(parent.read());
+        EXPECT_FALSE(isFree(port));
+        parent.kill();
+        EXPECT_TRUE(isFree(port));
+        EXPECT_TRUE(isNothingLeft(port));
+        EXPECT_EQ(::kill(child, SIGKILL), 0);
+    }
+}
+
+TEST(AccessFork, ChildThatReturnsThroughDestructorsLeavesTheParentsLock) {
+    const int port = freshPort();
+    ChildProcess parent("forker", {"return", std::to_string(port)});
+    EXPECT_EQ(parent.read(), "0");
+    EXPECT_FALSE(isFree(port));
+    parent.kill();
+    EXPECT_TRUE(isFree(port));
+}
+
+TEST(AccessUsers, ShareAPortWhateverTheirUmask) {
+    if (::geteuid() != 0) {
+        GTEST_SKIP() << "needs the right to become another user";
+    }
+    const int port = freshPort();
+    int ready[2];
+    int done[2];
+    ASSERT_EQ(::pipe(ready) + ::pipe(done), 0);
+    const pid_t other = ::fork();
+    if (other == 0) {
+        ::umask(0777);
+        if (::setgroups(0, nullptr) + ::setgid(65534) + ::setuid(65534) != 0) {
+            ::_exit(1);
+        }
+        Access access(port, Access::SHARE);
+        char byte = access.lock() ? 1 : 0;
+        ::_exit(::write(ready[1], &byte, 1) == 1 && ::read(done[0], &byte, 1) == 1 ? 0 : 1);  // like a kill
+    }
+    char byte = 0;
+    ASSERT_EQ(::read(ready[0], &byte, 1), 1);
+    Access access(port, Access::SHARE);
+    EXPECT_EQ(byte, 1);
+    EXPECT_FALSE(access.lock());
+    EXPECT_TRUE(access.cleanLock());
+    ASSERT_EQ(::write(done[1], &byte, 1), 1);
+    ::waitpid(other, nullptr, 0);
+    for (const int descriptor : {ready[0], ready[1], done[0], done[1]}) {
+        ::close(descriptor);
+    }
+}
+
+TEST(AccessUsers, LastCloserWhoMayNotRemoveLeavesItToTheNextOne) {
+    if (::geteuid() != 0) {
+        GTEST_SKIP() << "needs the right to become another user";
+    }
+    const int port = freshPort();
+    EXPECT_EQ(inChild([&] {
+                  Access access(port, Access::SHARE);
+                  return access.lock() && ::setuid(65534) == 0 ? 0 : 1;
+              }),
+              0);
+    EXPECT_EQ(inChild([&] { return ::setuid(65534) == 0 && isFree(port) ? 0 : 1; }), 0);
+    EXPECT_FALSE(isNothingLeft(port));
+    EXPECT_TRUE(isFree(port));
+    EXPECT_TRUE(isNothingLeft(port));
+}
+
+TEST(AccessKeys, CollidingNamesAreToldApart) {
+    std::unordered_map<key_t, std::string> names;
+    std::string first;
+    std::string second;
+    for (int i = 0; first.empty(); ++i) {
+        second = "tessal collision " + std::to_string(i);
+        const auto [place, isNew] = names.emplace(NamedSemaphore::keyOfName(second.c_str()), second);
+        first = isNew ? "" : place->second;
+    }
+    PlatformSemaphore* const one = NamedSemaphore::create(first.c_str(), 0, 1);
+    PlatformSemaphore* const two = NamedSemaphore::create(second.c_str(), 1, 1);
+    EXPECT_EQ(NamedSemaphore::take(one), NamedSemaphore::timedOut);
+    NamedSemaphore::close(one);
+    PlatformSemaphore* const again = NamedSemaphore::create(second.c_str(), 1, 1);  // not at the place that is free now
+    EXPECT_EQ(NamedSemaphore::take(two), NamedSemaphore::taken);
+    EXPECT_EQ(NamedSemaphore::take(again), NamedSemaphore::timedOut);
+    NamedSemaphore::close(two);
+    NamedSemaphore::close(again);
+    EXPECT_EQ(::semget(NamedSemaphore::keyOfName(first.c_str()), 0, 0), -1);
+}
+
+TEST(AccessKeys, ObjectsOfOtherProgramsAreLeftAlone) {
+    const int port = freshPort();
+    const int segment = ::shmget(keyOf(port), 8192, IPC_CREAT | 0666);
+    EXPECT_TRUE(isFree(port));  // beside it
+    EXPECT_NE(::shmget(keyOf(port), 0, 0), -1);
+    ::shmctl(segment, IPC_RMID, nullptr);
+    EXPECT_TRUE(isFree(port));
+    EXPECT_TRUE(isNothingLeft(port));
+    const int set = ::semget(keyOf(port), 1, IPC_CREAT | 0666);
+    const MessageRecorder messages;
+    EXPECT_FALSE(isFree(port));
+    EXPECT_THAT(messages.info(), ElementsAre(HasSubstr("another program's semaphore set has its key")));
+    EXPECT_EQ(::semctl(set, 0, GETVAL), 0);
+    ::semctl(set, 0, IPC_RMID);
+    EXPECT_TRUE(isFree(port));
+}
+
+TEST(AccessKeys, IdentifierZeroAndTheMachinesLimits) {
+    const int port = freshPort();
+    const int status = inChild([&] {
+        if (::unshare(CLONE_NEWIPC) != 0) {
+            return 77;
+        }
+        const Access first(port, Access::SHARE);
+        Access second(port, Access::SHARE);
+        const bool isZero = ::shmget(keyOf(port), 0, 0) == 0 && second.lock() && !isFree(port);
+        std::ofstream("/proc/sys/kernel/shmmni") << 1;
+        const MessageRecorder messages;
+        const bool refused = !isFree(port + 1) && messages.info().front().find("kernel.shmmni") != std::string::npos;
+        return isZero && refused ? 0 : 1;
+    });
+    if (status == 77) {
+        GTEST_SKIP() << "needs the right to make a name space of its own";
+    }
+    EXPECT_EQ(status, 0);
+}
+
+TEST(AccessDamage, OverwrittenCountsAndNamesHurtNobody) {
+    for (const std::int32_t garbage : {-1, 2, INT32_MIN, INT32_MAX}) {
+        const int port = freshPort();
+        Access access(port, Access::SHARE);
+        auto* const segment = static_cast<CountSegment*>(::shmat(::shmget(keyOf(port), 0, 0), nullptr, 0));
+        segment->count = garbage;
+        segment->maximum = garbage;
+        segment->name[0] ^= garbage == 2 ? 1 : 0;
+        const MessageRecorder messages;
+        access.lock();
+        access.unlock();
+        access.cleanLock();
+        access.getNormalizedCount();
+        isFree(port);
+        ::shmdt(segment);
+    }
+}
