@@ -275,6 +275,10 @@ HkString HkCmdArgs::help(const char* command, const char* format) {
     return toHkString(cmd::helpText(*cmd::compile(format), command != nullptr ? command : ""));
 }
 
+HkString HkCmdArgs::description(const char* format) {
+    return toHkString(cmd::compile(format)->help);
+}
+
 std::vector<HkString> HkCmdArgs::complete(int argc, const char* const* argv, const char* format) {
     const std::shared_ptr<const cmd::Format> compiled = cmd::compile(format);
     if (argc < 2 || argv == nullptr || compiled->isMalformed()) {

@@ -102,6 +102,8 @@ public:
     HkString help() const { return help(command(), formatText()); }
     static HkString usage(const char* command, const char* format);
     static HkString help(const char* command, const char* format);
+    /// What the command does, the first help text of the format; empty where there is none.
+    static HkString description(const char* format);
 
     /// The words that may stand in the last place of @p argv, which begin with what stands there already: choices
     /// where a value is due, else the switches and words that may still be given. Sorted as the format has them.
