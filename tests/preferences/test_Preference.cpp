@@ -104,9 +104,10 @@ TEST(Preference, RowsAndNamesOutsideTheTable) {
     }
     EXPECT_THAT(messages.all(), IsEmpty());
     EXPECT_FALSE(preferences.setPreference(outside[0], "x"));
-    for (const char* name : {"nosuch", "Alone", static_cast<const char*>(nullptr)}) {
+    for (const char* name : {"nosuch", "Alone"}) {
         EXPECT_THROW(TessalPreference::string2Pref(name), DataNotFoundException);
     }
+    EXPECT_EQ(TessalPreference::string2Pref(nullptr), alone) << "the row without a name";
     EXPECT_THAT(messages.info(), ElementsAre("Preference 5 is not defined. Check data file tessal.acd.\n",
                                              "nosuch is not in Preference Table.\n",
                                              "Alone is not in Preference Table.\n", " is not in Preference Table.\n"));
