@@ -108,9 +108,9 @@ TEST(Preference, RowsAndNamesOutsideTheTable) {
         EXPECT_THROW(TessalPreference::string2Pref(name), DataNotFoundException);
     }
     EXPECT_EQ(TessalPreference::string2Pref(nullptr), alone) << "the row without a name";
-    EXPECT_THAT(messages.info(), ElementsAre("Preference 5 is not defined. Check data file tessal.acd.\n",
-                                             "nosuch is not in Preference Table.\n",
-                                             "Alone is not in Preference Table.\n", " is not in Preference Table.\n"));
+    EXPECT_THAT(messages.info(),
+                ElementsAre("Preference 5 is not defined. Check data file tessal.acd.\n",
+                            "nosuch is not in Preference Table.\n", "Alone is not in Preference Table.\n"));
 }
 
 TEST(Preference, TheTableOutlivesTheObject) {
