@@ -10,6 +10,7 @@
 #include "BitOperations.h"
 #include "DebugTrace.h"
 #include "FileUtility.h"
+#include "Hex2Bit.h"
 #include "HkDir.h"
 #include "DeviceOptionsMgr.h"
 #include "HkEnv.h"
