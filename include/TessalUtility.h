@@ -17,6 +17,7 @@
 #include "DebugTrace.h"
 #include "DeviceOptionsMgr.h"
 #include "FileUtility.h"
+#include "Hex2Bit.h"
 #include "HkDir.h"
 #include "DeviceOptionsMgr.h"
 #include "HkCmdArgs.h"

@@ -52,7 +52,7 @@ void encodeHex(const unsigned char* from, std::size_t count, ByteOrder order, ch
     }
 }
 
-void packBits(const char* text, std::size_t count, BitMark mark, unsigned char* to) {
+void packBits(const char* text, std::size_t count, BitMark mark, bool lastBitFirst, unsigned char* to) {
     constexpr std::uint64_t sevenBits = 0x7F7F7F7F7F7F7F7FU;
     const std::uint64_t same = mark == BitMark::OnlyOne ? 0x3131313131313131U : 0x3030303030303030U;
     const unsigned flip = mark == BitMark::OnlyOne ? 0xFF : 0;
@@ -60,7 +60,8 @@ void packBits(const char* text, std::size_t count, BitMark mark, unsigned char* 
         // The top bit of each byte tells whether the character differs; the product gathers the eight of them.
         const std::uint64_t word = load64(text + 8 * i) ^ same;
         const std::uint64_t differs = (((word & sevenBits) + sevenBits) | word) & ~sevenBits;
-        to[i] = static_cast<unsigned char>(((differs >> 7) * 0x0102040810204080U >> 56) ^ flip);
+        const auto byte = static_cast<unsigned char>(((differs >> 7) * 0x0102040810204080U >> 56) ^ flip);
+        to[lastBitFirst ? count - 1 - i : i] = lastBitFirst ? ByteTables::mirroredByte[byte] : byte;
     }
 }
 

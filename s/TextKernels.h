@@ -22,8 +22,8 @@ struct TextKernels {
     bool (*decodeHex)(const char* text, std::size_t count, ByteOrder order, unsigned char* to);
     /// Turns bytes into 2 * @p count hex digits of lower case.
     void (*encodeHex)(const unsigned char* from, std::size_t count, ByteOrder order, char* text);
-    /// Turns 8 * @p count characters into bits, the first one being the lowest bit of the first byte.
-    void (*packBits)(const char* text, std::size_t count, BitMark mark, unsigned char* to);
+    /// Turns 8 * @p count characters into bits, from the lowest bit of the first byte up, or the other way.
+    void (*packBits)(const char* text, std::size_t count, BitMark mark, bool lastBitFirst, unsigned char* to);
     /// Turns bytes into 8 * @p count characters 0 and 1, from the lowest bit of the first byte up, or the other way.
     void (*unpackBits)(const unsigned char* from, std::size_t count, bool lastBitFirst, char* text);
 };

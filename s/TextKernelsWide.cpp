@@ -1,14 +1,14 @@
 // The inner loops between text and bytes for processors with 32-byte vectors. Each loop ends in the portable form.
 #include "s/TextKernels.h"
 
-#if defined(__GNUC__) && defined(__x86_64__) && !defined(TESSAL_NO_WIDE_VECTORS)
+#include "s/WideVectors.h"
+
+#if TESSAL_HAS_WIDE
 
 #include <immintrin.h>
 
 #include <cstdint>
 #include <cstring>
-
-#define TESSAL_WIDE __attribute__((target("avx2")))
 
 namespace {
 
@@ -143,16 +143,25 @@ void encodeHexInOrder(const unsigned char* from, std::size_t count, ByteOrder or
     }
 }
 
+template <bool lastBitFirst>
 TESSAL_WIDE void packBits(const char* text, std::size_t count, BitMark mark, unsigned char* to) {
     const __m256i same = _mm256_set1_epi8(mark == BitMark::OnlyOne ? '1' : '0');
     const std::uint32_t flip = mark == BitMark::OnlyOne ? 0 : 0xFFFFFFFFU;
     std::size_t i = 0;
     for (; i + 4 <= count; i += 4) {
-        const int equal = _mm256_movemask_epi8(_mm256_cmpeq_epi8(load32(text + 8 * i), same));
+        __m256i characters = load32(text + 8 * i);
+        if constexpr (lastBitFirst) {
+            characters = _mm256_permute4x64_epi64(_mm256_shuffle_epi8(characters, backward()), 0x4E);
+        }
+        const int equal = _mm256_movemask_epi8(_mm256_cmpeq_epi8(characters, same));
         const std::uint32_t bits = static_cast<std::uint32_t>(equal) ^ flip;
-        std::memcpy(to + i, &bits, sizeof bits);
+        std::memcpy(to + (lastBitFirst ? count - 4 - i : i), &bits, sizeof bits);
     }
-    portableTextKernels().packBits(text + 8 * i, count - i, mark, to + i);
+    portableTextKernels().packBits(text + 8 * i, count - i, mark, lastBitFirst, lastBitFirst ? to : to + i);
+}
+
+void packBitsInOrder(const char* text, std::size_t count, BitMark mark, bool lastBitFirst, unsigned char* to) {
+    lastBitFirst ? packBits<true>(text, count, mark, to) : packBits<false>(text, count, mark, to);
 }
 
 template <bool lastBitFirst>
@@ -181,9 +190,9 @@ void unpackBitsInOrder(const unsigned char* from, std::size_t count, bool lastBi
 }  // namespace
 
 const TextKernels* wideTextKernels() {
-    static constexpr TextKernels kernels{&mirrorBytes, &decodeHexInOrder, &encodeHexInOrder, &packBits,
+    static constexpr TextKernels kernels{&mirrorBytes, &decodeHexInOrder, &encodeHexInOrder, &packBitsInOrder,
                                          &unpackBitsInOrder};
-    return __builtin_cpu_supports("avx2") ? &kernels : nullptr;
+    return hasWideVectors() ? &kernels : nullptr;
 }
 
 #else

@@ -4,13 +4,14 @@
 // plain function, where the compiler splits each block into what the build's processor has, and into one marked
 // TESSAL_WIDE. The public function picks one by hasWideVectors().
 //
-// MinGW's g++ cannot keep 32-byte values aligned on the stack, so there both are the plain one.
+// Where the build says TESSAL_NO_WIDE_VECTORS, both are the plain one: g++ for Windows keeps 32-byte values safe on the
+// stack only with the help of its assembler (see cmake/Settings.cmake).
 #pragma once
 
 #include <cstdint>
 #include <cstring>
 
-#if defined(__x86_64__) && !defined(__MINGW32__)
+#if defined(__GNUC__) && defined(__x86_64__) && !defined(TESSAL_NO_WIDE_VECTORS)
 #define TESSAL_WIDE __attribute__((target("avx2")))
 #define TESSAL_HAS_WIDE 1
 #else

@@ -1,11 +1,11 @@
 // Each form of the inner loops against what one byte or character means, for all lengths around the vector widths.
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <random>
 #include <string>
 #include <vector>
 
+#include "hex/HexModel.h"
 #include "s/TextKernels.h"
 
 namespace {
@@ -14,27 +14,13 @@ using Bytes = std::vector<unsigned char>;
 
 constexpr std::size_t longest = 140;
 
-int digitOf(char character) {
-    const std::string digits = "0123456789abcdef";
-    const std::size_t place = digits.find(static_cast<char>(std::tolower(static_cast<unsigned char>(character))));
-    return place == std::string::npos || character == '\0' ? -1 : static_cast<int>(place);
-}
-
-unsigned char mirrored(unsigned char byte) {
-    unsigned result = 0;
-    for (int bit = 0; bit < 8; ++bit) {
-        result = result << 1 | (byte >> bit & 1U);
-    }
-    return static_cast<unsigned char>(result);
-}
-
 Bytes ordered(Bytes bytes, ByteOrder order) {
     if (order.lastByteFirst) {
         bytes = Bytes(bytes.rbegin(), bytes.rend());
     }
     if (order.mirrorBits) {
         for (unsigned char& byte : bytes) {
-            byte = mirrored(byte);
+            byte = HexModel::mirrored(byte);
         }
     }
     return bytes;
@@ -70,7 +56,7 @@ TEST_P(TextKernelsTest, HexTextAndBytesInAllOrders) {
             Bytes plain(count);
             for (std::size_t i = 0; i < text.size(); ++i) {
                 text[i] = "0123456789abcdefABCDEF"[m_random() % 22];
-                plain[i / 2] = static_cast<unsigned char>(plain[i / 2] << 4 | digitOf(text[i]));
+                plain[i / 2] = static_cast<unsigned char>(plain[i / 2] << 4 | HexModel::digitValue(text[i]));
             }
             Bytes bytes(count);
             ASSERT_TRUE(GetParam()->decodeHex(text.data(), count, order, bytes.data()));
@@ -94,7 +80,7 @@ TEST_P(TextKernelsTest, EveryCharacterInEveryPlaceIsJudged) {
                 std::string text(2 * count, '0');
                 text[place] = static_cast<char>(character);
                 ASSERT_EQ(GetParam()->decodeHex(text.data(), count, {false, false}, bytes.data()),
-                          digitOf(text[place]) >= 0)
+                          HexModel::digitValue(text[place]) >= 0)
                     << character << " at " << place;
             }
         }
@@ -115,9 +101,9 @@ TEST_P(TextKernelsTest, BinaryTextAndBits) {
         EXPECT_EQ(made, std::string(text.rbegin(), text.rend()));
 
         Bytes back(count);
-        GetParam()->packBits(text.data(), count, BitMark::OnlyOne, back.data());
+        GetParam()->packBits(text.data(), count, BitMark::OnlyOne, false, back.data());
         EXPECT_EQ(back, bytes);
-        GetParam()->packBits(text.data(), count, BitMark::AllButZero, back.data());
+        GetParam()->packBits(made.data(), count, BitMark::AllButZero, true, back.data());
         EXPECT_EQ(back, bytes);
     }
 }
@@ -129,8 +115,8 @@ TEST_P(TextKernelsTest, OnlyTheMarkedCharactersCountAsOne) {
     }
     Bytes ones(32);
     Bytes notZeros(32);
-    GetParam()->packBits(text.data(), 32, BitMark::OnlyOne, ones.data());
-    GetParam()->packBits(text.data(), 32, BitMark::AllButZero, notZeros.data());
+    GetParam()->packBits(text.data(), 32, BitMark::OnlyOne, false, ones.data());
+    GetParam()->packBits(text.data(), 32, BitMark::AllButZero, false, notZeros.data());
     for (std::size_t i = 0; i < text.size(); ++i) {
         EXPECT_EQ(ones[i / 8] >> i % 8 & 1, i == '1') << i;
         EXPECT_EQ(notZeros[i / 8] >> i % 8 & 1, i != '0') << i;
