@@ -1,34 +1,54 @@
 // 32-byte vectors behind a check at run time.
 //
-// A kernel's body is written once, on Block values, as a TESSAL_INLINE_BODY function. It is compiled twice: into a
-// plain function, where the compiler splits each block into what the build's processor has, and into one marked
-// TESSAL_WIDE. The public function picks one by hasWideVectors().
-//
-// MinGW's g++ cannot keep 32-byte values aligned on the stack, so there both are the plain one.
+// The body of a kernel is written once, as a TESSAL_INLINE_BODY template on the block it works with. It is compiled
+// twice: for NarrowBlock into a plain function, and for WideBlock into one marked TESSAL_WIDE. The kernel picks one by
+// hasWideVectors().
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <cstring>
 
+// MinGW's g++ cannot keep 32-byte values aligned on the stack, so there it is narrow blocks throughout.
 #if defined(__x86_64__) && !defined(__MINGW32__)
-#define TESSAL_WIDE __attribute__((target("avx2")))
 #define TESSAL_HAS_WIDE 1
+#define TESSAL_WIDE __attribute__((target("avx2")))
 #else
-#define TESSAL_WIDE
 #define TESSAL_HAS_WIDE 0
+#define TESSAL_WIDE
 #endif
 
 #define TESSAL_INLINE_BODY inline __attribute__((always_inline))
 
-/// Four words that are worked on side by side.
-using Block = std::uint64_t __attribute__((vector_size(32)));
-constexpr std::size_t blockBytes = sizeof(Block);
-
-/// True when the processor has what functions marked TESSAL_WIDE need.
-inline bool hasWideVectors() {
+/// Words that are worked on side by side.
+using NarrowBlock = std::uint64_t __attribute__((vector_size(16)));
 #if TESSAL_HAS_WIDE
-    return __builtin_cpu_supports("avx2") != 0;
+using WideBlock = std::uint64_t __attribute__((vector_size(32)));
 #else
-    return false;
+using WideBlock = NarrowBlock;
 #endif
+
+/// Whether the processor has what functions marked TESSAL_WIDE need. Tests clear it to run the narrow form.
+extern bool wideVectors;
+
+inline bool hasWideVectors() { return wideVectors; }
+
+template <class Block>
+TESSAL_INLINE_BODY void loadBlock(Block& block, const void* bytes) {
+    std::memcpy(&block, bytes, sizeof block);
+}
+
+template <class Block>
+TESSAL_INLINE_BODY void storeBlock(void* bytes, const Block& block) {
+    std::memcpy(bytes, &block, sizeof block);
+}
+
+/// The bits that any word of the block has.
+template <class Block>
+TESSAL_INLINE_BODY std::uint64_t anyBits(const Block& block) {
+    std::uint64_t bits = 0;
+    for (std::size_t i = 0; i < sizeof(Block) / sizeof(std::uint64_t); ++i) {
+        bits |= block[i];
+    }
+    return bits;
 }
