@@ -77,20 +77,22 @@ TESSAL_INLINE_BODY unsigned char shiftedByte(const unsigned char* source, unsign
 }
 
 /// One block; all of it is read before any of it is written.
+template <class Block>
 TESSAL_INLINE_BODY void copyShiftedBlock(unsigned char* target, const unsigned char* source, unsigned shift) {
     Block low;
     Block high;
-    std::memcpy(&low, source, sizeof low);
-    std::memcpy(&high, source + 1, sizeof high);
+    loadBlock(low, source);
+    loadBlock(high, source + 1);
     low = low >> shift | high << (8 - shift);
-    std::memcpy(target, &low, sizeof low);
+    storeBlock(target, low);
 }
 
+template <class Block>
 TESSAL_INLINE_BODY void copyUpwards(unsigned char* target, const unsigned char* source, std::size_t count,
                                     unsigned shift) {
     std::size_t i = 0;
-    for (; i + blockBytes <= count; i += blockBytes) {
-        copyShiftedBlock(target + i, source + i, shift);
+    for (; i + sizeof(Block) <= count; i += sizeof(Block)) {
+        copyShiftedBlock<Block>(target + i, source + i, shift);
     }
     for (; i + sizeof(Word) <= count; i += sizeof(Word)) {
         storeWord(target + i, shiftedWord(source + i, shift));
@@ -100,11 +102,12 @@ TESSAL_INLINE_BODY void copyUpwards(unsigned char* target, const unsigned char* 
     }
 }
 
+template <class Block>
 TESSAL_INLINE_BODY void copyDownwards(unsigned char* target, const unsigned char* source, std::size_t count,
                                       unsigned shift) {
     std::size_t i = count;
-    for (; i >= blockBytes; i -= blockBytes) {
-        copyShiftedBlock(target + i - blockBytes, source + i - blockBytes, shift);
+    for (; i >= sizeof(Block); i -= sizeof(Block)) {
+        copyShiftedBlock<Block>(target + i - sizeof(Block), source + i - sizeof(Block), shift);
     }
     for (; i >= sizeof(Word); i -= sizeof(Word)) {
         storeWord(target + i - sizeof(Word), shiftedWord(source + i - sizeof(Word), shift));
@@ -114,21 +117,19 @@ TESSAL_INLINE_BODY void copyDownwards(unsigned char* target, const unsigned char
     }
 }
 
-using ShiftedCopy = void(unsigned char*, const unsigned char*, std::size_t, unsigned);
+template <class Block>
+TESSAL_INLINE_BODY void copyShifted(unsigned char* target, const unsigned char* source, std::size_t count,
+                                    unsigned shift, bool upwards) {
+    if (upwards) {
+        copyUpwards<Block>(target, source, count, shift);
+    } else {
+        copyDownwards<Block>(target, source, count, shift);
+    }
+}
 
-void copyUpwardsPlain(unsigned char* target, const unsigned char* source, std::size_t count, unsigned shift) {
-    copyUpwards(target, source, count, shift);
-}
-TESSAL_WIDE void copyUpwardsWide(unsigned char* target, const unsigned char* source, std::size_t count,
-                                 unsigned shift) {
-    copyUpwards(target, source, count, shift);
-}
-void copyDownwardsPlain(unsigned char* target, const unsigned char* source, std::size_t count, unsigned shift) {
-    copyDownwards(target, source, count, shift);
-}
-TESSAL_WIDE void copyDownwardsWide(unsigned char* target, const unsigned char* source, std::size_t count,
-                                   unsigned shift) {
-    copyDownwards(target, source, count, shift);
+TESSAL_WIDE void copyShiftedWide(unsigned char* target, const unsigned char* source, std::size_t count, unsigned shift,
+                                 bool upwards) {
+    copyShifted<WideBlock>(target, source, count, shift, upwards);
 }
 
 /// Whole target bytes from any bit of the source, in the given direction.
@@ -143,10 +144,11 @@ void copyWholeBytes(unsigned char* target, const unsigned char* source, std::siz
         std::memmove(target, source, count);
         return;
     }
-    const bool wide = hasWideVectors();
-    ShiftedCopy* const copy =
-        upwards ? (wide ? copyUpwardsWide : copyUpwardsPlain) : (wide ? copyDownwardsWide : copyDownwardsPlain);
-    copy(target, source, count, shift);
+    if (hasWideVectors()) {
+        copyShiftedWide(target, source, count, shift, upwards);
+    } else {
+        copyShifted<NarrowBlock>(target, source, count, shift, upwards);
+    }
 }
 
 // ---- Logic on whole bytes.
@@ -175,18 +177,18 @@ constexpr bool readsTarget(Logic logic) {
     return logic == Logic::And || logic == Logic::Or || logic == Logic::Xor;
 }
 
-template <Logic logic>
+template <Logic logic, class Block>
 TESSAL_INLINE_BODY void combineBody(unsigned char* target, const unsigned char* source, std::size_t count) {
     std::size_t i = 0;
-    for (; i + blockBytes <= count; i += blockBytes) {
+    for (; i + sizeof(Block) <= count; i += sizeof(Block)) {
         Block mine{};
         Block other;
         if constexpr (readsTarget(logic)) {
-            std::memcpy(&mine, target + i, sizeof mine);
+            loadBlock(mine, target + i);
         }
-        std::memcpy(&other, source + i, sizeof other);
+        loadBlock(other, source + i);
         combineValue<logic>(mine, other);
-        std::memcpy(target + i, &mine, sizeof mine);
+        storeBlock(target + i, mine);
     }
     for (; i < count; i += sizeof(Word)) {
         const std::size_t left = count - i;
@@ -198,7 +200,7 @@ TESSAL_INLINE_BODY void combineBody(unsigned char* target, const unsigned char* 
 
 template <Logic logic>
 TESSAL_WIDE void combineWide(unsigned char* target, const unsigned char* source, std::size_t count) {
-    combineBody<logic>(target, source, count);
+    combineBody<logic, WideBlock>(target, source, count);
 }
 
 template <Logic logic>
@@ -206,23 +208,26 @@ void combine(unsigned char* target, const unsigned char* source, std::size_t cou
     if (hasWideVectors()) {
         combineWide<logic>(target, source, count);
     } else {
-        combineBody<logic>(target, source, count);
+        combineBody<logic, NarrowBlock>(target, source, count);
     }
 }
 
-// ---- Searching and counting in whole bytes.
+// ---- Searching in whole bytes.
 
-/// The number of leading bytes, in steps of blocks, that all equal the filler.
+/// The number of leading bytes, in steps of eight words, that all equal the filler.
+template <class Block>
 TESSAL_INLINE_BODY std::size_t skipBody(const unsigned char* bytes, std::size_t count, Word filler) {
-    const Block fill = {filler, filler, filler, filler};
+    constexpr std::size_t step = 8 * sizeof(Word);
+    const Block fill = Block{} + filler;
     std::size_t i = 0;
-    for (; i + 2 * blockBytes <= count; i += 2 * blockBytes) {
-        Block a;
-        Block b;
-        std::memcpy(&a, bytes + i, sizeof a);
-        std::memcpy(&b, bytes + i + blockBytes, sizeof b);
-        a = (a ^ fill) | (b ^ fill);
-        if ((a[0] | a[1] | a[2] | a[3]) != 0) {
+    for (; i + step <= count; i += step) {
+        Block differences{};
+        for (std::size_t part = 0; part < step; part += sizeof(Block)) {
+            Block block;
+            loadBlock(block, bytes + i + part);
+            differences |= block ^ fill;
+        }
+        if (anyBits(differences) != 0) {
             break;
         }
     }
@@ -230,11 +235,11 @@ TESSAL_INLINE_BODY std::size_t skipBody(const unsigned char* bytes, std::size_t 
 }
 
 TESSAL_WIDE std::size_t skipWide(const unsigned char* bytes, std::size_t count, Word filler) {
-    return skipBody(bytes, count, filler);
+    return skipBody<WideBlock>(bytes, count, filler);
 }
 
 std::size_t skip(const unsigned char* bytes, std::size_t count, Word filler) {
-    return hasWideVectors() ? skipWide(bytes, count, filler) : skipBody(bytes, count, filler);
+    return hasWideVectors() ? skipWide(bytes, count, filler) : skipBody<NarrowBlock>(bytes, count, filler);
 }
 
 }  // namespace

@@ -1,0 +1,16 @@
+#include "s/WideVectors.h"
+
+namespace {
+
+bool processorHasWideVectors() {
+#if TESSAL_HAS_WIDE
+    return __builtin_cpu_supports("avx2") != 0;
+#else
+    return false;
+#endif
+}
+
+}  // namespace
+
+// Until it is set, while statics of other units are made, the narrow form serves.
+bool wideVectors = processorHasWideVectors();
