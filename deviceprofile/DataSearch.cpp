@@ -1,12 +1,12 @@
 #include "deviceprofile/DataSearch.h"
 
+#include <algorithm>
 #include <exception>
 #include <mutex>
 #include <string_view>
 #include <system_error>
 
 #include "DataPath.h"
-#include "HkEnv.h"
 #include "platform/HostPaths.h"
 
 namespace DeviceProfile {
@@ -37,7 +37,7 @@ std::string currentlySet() {
 std::vector<std::string> splitList(std::string_view list) {
     std::vector<std::string> members;
     while (!list.empty()) {
-        const std::size_t length = std::min(list.find(HostPaths::listSeparator), list.size());
+        const std::size_t length = std::min(list.find(platform::listSeparator), list.size());
         if (length != 0) {
             members.emplace_back(list.substr(0, length));
         }
@@ -65,7 +65,7 @@ void setDataPath(const char* directories) {
 std::string SearchPath::text() const {
     std::string list;
     for (const std::string& directory : directories) {
-        list += (list.empty() ? "" : std::string(1, HostPaths::listSeparator)) + directory;
+        list += (list.empty() ? "" : std::string(1, platform::listSeparator)) + directory;
     }
     return list;
 }
@@ -74,8 +74,7 @@ SearchPath searchPath() {
     if (auto directories = splitList(currentlySet()); !directories.empty()) {
         return {"setDataPath", std::move(directories)};
     }
-    const char* const variable = HkEnv::GetEnv(pathVariable);
-    if (auto directories = splitList(variable != nullptr ? variable : ""); !directories.empty()) {
+    if (auto directories = splitList(platform::environmentValue(pathVariable)); !directories.empty()) {
         return {pathVariable, std::move(directories)};
     }
     return {"the installation", installedDirectories()};
@@ -106,7 +105,7 @@ std::vector<fs::path> placesOf(const std::string& name, const SearchPath& search
 
 fs::path installationPrefix() {
     // The library lies in <prefix>/bin, <prefix>/lib or <prefix>/lib/<architecture>.
-    const fs::path directory = pathOf(HostPaths::libraryFile()).parent_path();
+    const fs::path directory = pathOf(platform::libraryFile()).parent_path();
     const fs::path near = directory.parent_path();
     const fs::path far = near.parent_path();
     std::error_code error;

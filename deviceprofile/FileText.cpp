@@ -114,6 +114,7 @@ FileText openDataFile(const std::string& name, bool report) {
             problems += "; " + place.u8string() + " " + problem;
         }
     }
+    reserve(text, 0);
     if (report) {
         origin.report().issueInfo("Data file \"%s\" cannot be read: searched \"%s\", given by %s%s.\n", name.c_str(),
                                   search.text().c_str(), search.source, problems.c_str());

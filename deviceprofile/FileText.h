@@ -20,7 +20,7 @@ struct FileText {
 /// Reads a whole file. Gives null, or what is wrong with it: a constant text such as "is a directory".
 const char* readFile(const std::filesystem::path& path, FileText& result);
 
-/// Reads the first file of this name that can be read. Without one the result has no bytes and, with @p report, one
+/// Reads the first file of this name that can be read. Without one the result is empty and, with @p report, one
 /// message tells where was searched and what was wrong.
 FileText openDataFile(const std::string& name, bool report);
 

@@ -7,34 +7,31 @@
 
 namespace DeviceProfile {
 
-struct KeyEntry {
-    std::string_view key;
-    std::string_view value;  ///< a zero stands behind it
-    std::uint32_t line;
-};
-
-/// A flat hash table over texts that belong to somebody else.
+/// A flat hash table of places in one text, which belongs to somebody else. At a place there is the key, a zero, its
+/// value, and a zero.
 class KeyList {
 public:
-    /// Sets a key. Gives the line where it was set before, 0 when it is new.
-    std::uint32_t set(const KeyEntry& entry);
+    /// All keys lie in the text that begins here, within its first 4 GiB.
+    explicit KeyList(const char* text) : m_text(text) {}
 
-    /// The entry of the key, or null. Entries stay where they are once all keys are set.
-    const KeyEntry* find(std::string_view key) const;
+    /// Sets the key at this place of the text. Gives the line where it was set before, 0 when it is new.
+    std::uint32_t set(const char* key, std::uint32_t line);
+
+    /// The place of the key, or null.
+    const char* find(std::string_view key) const;
 
 private:
     struct Slot {
-        std::uint32_t hash = 0;
-        std::uint32_t entry = none;
+        std::uint32_t place;
+        std::uint32_t line;  ///< counted from 1; 0 in a free slot
     };
-    static constexpr std::uint32_t none = 0xFFFFFFFFU;
 
-    static std::uint32_t hashOf(std::string_view key);
-    std::size_t slotOf(std::string_view key, std::uint32_t hash) const;
+    std::size_t slotOf(std::string_view key) const;
     void grow();
 
-    std::vector<KeyEntry> m_entries;
-    std::vector<Slot> m_slots;  ///< a power of two of them, at most half of them taken
+    const char* m_text;
+    std::vector<Slot> m_slots;  ///< a power of two, at least half of them free
+    std::size_t m_count = 0;
 };
 
 }  // namespace DeviceProfile

@@ -14,6 +14,10 @@ const char* profileOf(const ProfilePick* pick) {
     return profile != nullptr ? profile : defaultProfile;
 }
 
+const char* textOf(const char* text) {
+    return text != nullptr ? text : "";
+}
+
 }  // namespace
 
 ProfileKeyTable::ProfileKeyTable(const char* dataFile, ProfilePick* pick, unsigned char reportAbsent,
@@ -26,7 +30,7 @@ ProfileKeyTable::~ProfileKeyTable() = default;
 
 const char* ProfileKeyTable::getstringbykey(const char* key, const char* rowSeparator, short rowIndex,
                                             const char* fieldSeparator, short fieldIndex) {
-    return m_cells->cell(key, rowSeparator, rowIndex, fieldSeparator, fieldIndex);
+    return m_cells->cell(textOf(key), textOf(rowSeparator), rowIndex, textOf(fieldSeparator), fieldIndex);
 }
 
 int ProfileKeyTable::GetInt32ByKey(const char* key, const char* rowSeparator, short rowIndex,

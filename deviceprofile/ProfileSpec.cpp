@@ -141,16 +141,16 @@ char* ProfileSpec::getexecfilename(char kind, const char* name, unsigned char mu
     if (HkStr::Len(name) == 0 || prefix.empty()) {
         return nullptr;
     }
-    const KindOfFile kinds[] = {{'x', HostPaths::programEnding}};
+    const KindOfFile kinds[] = {{'x', platform::programEnding}};
     const fs::path program = prefix / "bin" / pathOf(withEnding(name, kind, kinds));
     return mustExist == 0 || isFile(program) ? handOut(program.u8string()) : nullptr;
 }
 
 char* ProfileSpec::getdllfilename(const char* name) const {
-    const fs::path directory = pathOf(HostPaths::libraryFile()).parent_path();
+    const fs::path directory = pathOf(platform::libraryFile()).parent_path();
     if (HkStr::Len(name) == 0 || directory.empty()) {
         return nullptr;
     }
     return handOut(
-        (directory / pathOf(std::string(HostPaths::libraryPrefix) + name + HostPaths::libraryEnding)).u8string());
+        (directory / pathOf(std::string(platform::libraryPrefix) + name + platform::libraryEnding)).u8string());
 }

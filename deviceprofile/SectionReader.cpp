@@ -2,6 +2,7 @@
 
 #include <cstring>
 #include <string>
+#include <unordered_set>
 
 #include "deviceprofile/Blanks.h"
 #include "deviceprofile/LogicalLines.h"
@@ -53,7 +54,8 @@ public:
         : m_text(text),
           m_section(section),
           m_reports(reports),
-          m_hasZeros(std::memchr(text.bytes.get(), 0, text.size) != nullptr) {}
+          m_hasZeros(std::memchr(text.bytes.get(), 0, text.size) != nullptr),
+          m_keys(text.bytes.get()) {}
 
     KeyList read() {
         LogicalLines lines(m_text.bytes.get(), m_text.bytes.get() + m_text.size);
@@ -100,21 +102,25 @@ private:
             return "a key before the first [section]";
         }
         if (m_isWanted) {
-            const char* const value = skipBlanks(line.equals + 1, line.end);
-            add({textOf(line.begin, keyEnd), textOf(value, line.end), line.number}, line.isCutOff);
+            add(line, textOf(line.begin, keyEnd));
         }
         return nullptr;
     }
 
-    void add(const KeyEntry& entry, bool isCutOff) {
-        if (isCutOff && m_reports.malformed && mayReport()) {
+    /// Moves the key up to its value, a zero between them, which makes it an entry of the list.
+    void add(const LogicalLine& line, std::string_view name) {
+        char* const value = skipBlanks(line.equals + 1, line.end);
+        char* const key = value - 1 - name.size();
+        std::memmove(key, name.data(), name.size());
+        value[-1] = '\0';
+        if (line.isCutOff && m_reports.malformed && mayReport()) {
             origin.report().issueInfo("%s:%u: the file ends where the value of %s should go on.\n", m_text.name.c_str(),
-                                      entry.line, quote(entry.key).c_str());
+                                      line.number, quote(key).c_str());
         }
-        const std::uint32_t former = m_keys.set(entry);
+        const std::uint32_t former = m_keys.set(key, line.number);
         if (former != 0 && m_reports.repeated && mayReport()) {
             origin.report().issueInfo("%s:%u: %s is set again and replaces the value of line %u.\n",
-                                      m_text.name.c_str(), entry.line, quote(entry.key).c_str(), former);
+                                      m_text.name.c_str(), line.number, quote(key).c_str(), former);
         }
     }
 
@@ -144,12 +150,12 @@ KeyList readSection(FileText& text, std::string_view section, LineReports report
 }
 
 std::vector<std::string_view> listSections(FileText& text) {
-    KeyList seen;
+    std::unordered_set<std::string_view> seen;
     std::vector<std::string_view> names;
     LogicalLines lines(text.bytes.get(), text.bytes.get() + text.size);
     for (LogicalLine line; lines.next(line);) {
         const std::string_view name = *line.begin == '[' ? sectionName(line) : std::string_view();
-        if (!name.empty() && seen.set({name, {}, line.number}) == 0) {
+        if (!name.empty() && seen.insert(name).second) {
             names.push_back(name);
         }
     }

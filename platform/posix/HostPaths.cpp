@@ -4,10 +4,11 @@
 #include <link.h>
 
 #include <cstdint>
+#include <cstdlib>
 #include <filesystem>
 #include <system_error>
 
-namespace HostPaths {
+namespace platform {
 namespace {
 
 const char anchor = 0;
@@ -51,9 +52,14 @@ std::string libraryFile() {
     return std::filesystem::canonical(info.dli_fname, error).string();
 }
 
+std::string environmentValue(const char* name) {
+    const char* const value = std::getenv(name);
+    return value != nullptr ? value : "";
+}
+
 const char listSeparator = ':';
 const char* const libraryPrefix = "lib";
 const char* const libraryEnding = ".so";
 const char* const programEnding = "";
 
-}  // namespace HostPaths
+}  // namespace platform

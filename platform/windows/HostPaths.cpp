@@ -2,13 +2,16 @@
 
 #include <windows.h>
 
+#include <exception>
 #include <filesystem>
+#include <string>
 
-namespace HostPaths {
+namespace platform {
 namespace {
 
 const char anchor = 0;
-constexpr std::size_t longestPath = 32768;
+/// No path and no environment variable is longer on this host.
+constexpr DWORD longestText = 32768;
 
 HMODULE ownModule() {
     HMODULE module = nullptr;
@@ -16,16 +19,27 @@ HMODULE ownModule() {
     return GetModuleHandleExW(flags, reinterpret_cast<LPCWSTR>(&anchor), &module) != 0 ? module : nullptr;
 }
 
+/// Empty for a text that is no valid UTF-16.
+std::string toUtf8(const std::wstring& text) {
+    try {
+        return std::filesystem::path(text).u8string();
+    } catch (const std::exception&) {
+        return {};
+    }
+}
+
 }  // namespace
 
 std::string libraryFile() {
-    std::wstring name(longestPath, L'\0');
-    name.resize(GetModuleFileNameW(ownModule(), name.data(), static_cast<DWORD>(name.size())));
-    try {
-        return std::filesystem::path(name).u8string();
-    } catch (const std::exception&) {
-        return {};  // a name that is no valid UTF-16
-    }
+    std::wstring file(longestText, L'\0');
+    file.resize(GetModuleFileNameW(ownModule(), file.data(), longestText));
+    return toUtf8(file);
+}
+
+std::string environmentValue(const char* name) {
+    std::wstring value(longestText, L'\0');
+    value.resize(GetEnvironmentVariableW(std::filesystem::u8path(name).c_str(), value.data(), longestText));
+    return toUtf8(value);
 }
 
 const char listSeparator = ';';
@@ -33,4 +47,4 @@ const char* const libraryPrefix = "lib";
 const char* const libraryEnding = ".dll";
 const char* const programEnding = ".exe";
 
-}  // namespace HostPaths
+}  // namespace platform
