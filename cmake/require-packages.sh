@@ -25,7 +25,7 @@ list_missing() {
     missing=()
     local need
     for need in "$@"; do
-        is_there "$need" || missing+=("${need%%=*}")
+        is_there "$need" || [[ " ${missing[*]} " == *" ${need%%=*} "* ]] || missing+=("${need%%=*}")
     done
 }
 

@@ -18,7 +18,8 @@ std::size_t allocations = 0;
 
 }  // namespace
 
-void* operator new(std::size_t size) {
+// Not inlined: the compiler would see malloc's memory go to delete and warn.
+[[gnu::noinline]] void* operator new(std::size_t size) {
     ++allocations;
     if (void* const memory = std::malloc(size)) {
         return memory;
@@ -26,11 +27,11 @@ void* operator new(std::size_t size) {
     throw std::bad_alloc();
 }
 
-void operator delete(void* memory) noexcept {
+[[gnu::noinline]] void operator delete(void* memory) noexcept {
     std::free(memory);
 }
 
-void operator delete(void* memory, std::size_t) noexcept {
+[[gnu::noinline]] void operator delete(void* memory, std::size_t) noexcept {
     std::free(memory);
 }
 

@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # about: every row of the benchmark table runs, once and shortly
-# needs: libbenchmark-dev=/usr/include/benchmark/benchmark.h
+# needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h
 # limit: 600
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"

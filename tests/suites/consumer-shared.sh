@@ -6,7 +6,7 @@ set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 source "$(dirname "${BASH_SOURCE[0]}")/lib/consumer.sh"
 
-install_library -DBUILD_SHARED_LIBS=ON
+install_library shared
 build_consumer
 
 library=$(find "$installed" -name 'libTessalUtility.so')

@@ -6,11 +6,9 @@ set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 source "$(dirname "${BASH_SOURCE[0]}")/lib/consumer.sh"
 
-toolchain=-DCMAKE_TOOLCHAIN_FILE=$root/cmake/mingw-w64.cmake
-install_library "$toolchain" -DBUILD_SHARED_LIBS=ON
+install_library windows
 for file in bin/libTessalUtility.dll lib/libTessalUtility.dll.a; do
     [ -f "$installed/$file" ] || { echo "$file is not installed." >&2; exit 1; }
 done
 # Windows looks for a DLL beside the program.
-mkdir -p "$work/consumer"
-build_consumer "$toolchain" -DCMAKE_FIND_ROOT_PATH="$installed" -DCMAKE_RUNTIME_OUTPUT_DIRECTORY="$installed/bin"
+build_consumer -DCMAKE_TOOLCHAIN_FILE="$root/cmake/mingw-w64.cmake" -DCMAKE_FIND_ROOT_PATH="$installed" -DCMAKE_RUNTIME_OUTPUT_DIRECTORY="$installed/bin"

@@ -1,21 +1,25 @@
 # For the consumer suites: installs the library as others find it, and builds tests/consumer against it.
 
-# The folder of this suite's own builds; a suite always starts with a fresh installation.
+# The folder of this suite's own builds.
 work=$root/build/suites/$(basename "$0" .sh)
 installed=$work/installed
 
-# install_library [OPTION...]: builds the library alone and installs it.
+# install_library static|shared|windows: a fresh installation. The static one is that of preset release.
 install_library() {
+    local build=$root/build/release
     rm -rf "$installed" "$work/consumer"
-    quietly configure "$work/library" -DCMAKE_BUILD_TYPE=Release -DTESSAL_TESTS=OFF -DTESSAL_EXAMPLES=OFF \
-        -DCMAKE_INSTALL_PREFIX="$installed" "$@"
-    step "library built" cmake --build "$work/library" --parallel "$jobs"
-    quietly cmake --install "$work/library"
-    quietly check_headers
+    case $1 in
+        static) quietly configure_preset release ;;
+        shared) build=$root/build/suites/shared; configure_shared "$build" ;;
+        windows) build=$work/library; configure_shared "$build" -DCMAKE_TOOLCHAIN_FILE="$root/cmake/mingw-w64.cmake" ;;
+    esac
+    step "library built, $1" cmake --build "$build" --parallel "$jobs" --target TessalUtility
+    quietly cmake --install "$build" --prefix "$installed"
+    quietly diff <(cd "$root/include" && ls) <(cd "$installed/include/TessalUtility" && ls)
 }
 
-check_headers() {
-    diff <(cd "$root/include" && ls) <(cd "$installed/include/TessalUtility" && ls)
+configure_shared() {
+    quietly configure "$1" -DCMAKE_BUILD_TYPE=Release -DBUILD_SHARED_LIBS=ON -DTESSAL_TESTS=OFF -DTESSAL_EXAMPLES=OFF "${@:2}"
 }
 
 # build_consumer [OPTION...]: builds the consumer and runs its tests.
