@@ -1,6 +1,6 @@
 // The combined addresses of PromUtility.
 
-#include <cstdint>
+#include <limits>
 
 #include "Hex2Bit.h"
 #include "HkStr.h"
@@ -25,8 +25,13 @@ unsigned int numberOf(const char* hexText) {
 }
 
 HkString upperHex(unsigned int number) {
-    HkString text(Hex2Bit::convertInt2HexString(static_cast<int>(number)));
-    text.MakeUpper();
+    HkString text;
+    if (number > static_cast<unsigned int>(std::numeric_limits<int>::max())) {
+        text.Format("%08X", number);  // Hex2Bit takes the number as a signed one
+    } else {
+        text = Hex2Bit::convertInt2HexString(static_cast<int>(number));
+        text.MakeUpper();
+    }
     return text;
 }
 
