@@ -17,7 +17,7 @@ std::string valueUsage(const Value& value) {
 /// The rule with brackets and dots: "[-u <code>]".
 std::string usageOf(const Rule& rule) {
     const std::string text = bareUsage(rule);
-    const std::string bracketed = rule.required ? text : "[" + text + "]";
+    std::string bracketed = rule.required ? text : "[" + text + "]";
     if (!rule.repeated) {
         return bracketed;
     }
