@@ -200,7 +200,8 @@ HkString& HkString::Format(const char* format, ...) {
     std::va_list again;
     va_start(arguments, format);
     va_copy(again, arguments);
-    const int written = std::vsnprintf(shortText, sizeof shortText, format != nullptr ? format : "", arguments);
+    format = format != nullptr ? format : "";
+    const int written = std::vsnprintf(shortText, sizeof shortText, format, arguments);
     const std::size_t length = written > 0 ? static_cast<std::size_t>(written) : 0;
     if (length < sizeof shortText) {
         assign({shortText, length});
