@@ -21,6 +21,7 @@ struct Identity {
     BY_HANDLE_FILE_INFORMATION information{};
 
     bool isFile() const { return exists && (information.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) == 0; }
+    bool isProtected() const { return (information.dwFileAttributes & FILE_ATTRIBUTE_READONLY) != 0; }
     bool isSame(const Identity& other) const {
         return exists && other.exists && information.dwVolumeSerialNumber == other.information.dwVolumeSerialNumber &&
                information.nFileIndexHigh == other.information.nFileIndexHigh &&
@@ -68,7 +69,8 @@ bool copyFile(const char* source, const char* destination) {
     const std::wstring target = linkResolved(nativePath(destination));
     const Identity original = identify(from);
     const Identity former = identify(target);
-    if (!original.isFile() || (former.exists && !former.isFile()) || former.isSame(original)) {
+    if (!original.isFile() || (former.exists && (!former.isFile() || former.isProtected())) ||
+        former.isSame(original)) {
         return false;
     }
     const std::wstring copy = temporaryBeside(target);

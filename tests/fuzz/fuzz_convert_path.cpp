@@ -1,0 +1,72 @@
+// Paths of any form against the state table of the front, walked character by character.
+#include <cstdint>
+#include <cstdlib>
+#include <optional>
+#include <string>
+
+#include "FileUtility.h"
+#include "HkFile.h"
+#include "HkMessageManager.h"
+
+namespace {
+
+bool isSeparator(char ch) {
+    return ch == '/' || ch == '\\';
+}
+
+enum class State { Start, OneDot, TwoDots };
+
+/// The expected result, or nothing for an illegal path.
+std::optional<std::string> convertBySteps(const std::string& path, const std::string& root) {
+    State state = State::Start;
+    int levels = 0;
+    std::size_t i = 0;
+    for (; i < path.size() && !(state == State::Start && path[i] != '.' && !isSeparator(path[i])); ++i) {
+        if (path[i] == '.') {
+            if (state == State::TwoDots) {
+                return std::nullopt;
+            }
+            state = state == State::Start ? State::OneDot : State::TwoDots;
+        } else if (isSeparator(path[i])) {
+            levels += state == State::TwoDots ? 1 : 0;
+            state = State::Start;
+        } else {
+            return std::nullopt;
+        }
+    }
+    std::size_t end = root.size();
+    for (std::size_t at = root.size(); levels > 0 && at-- > 0;) {
+        if (isSeparator(root[at]) && --levels == 0) {
+            end = at;
+        }
+    }
+    return root.substr(0, end) + "/" + path.substr(i);
+}
+
+bool isAbsolute(const std::string& path) {
+    return (!path.empty() && isSeparator(path[0])) || path.find(':') != std::string::npos;
+}
+
+std::string rootOf(const std::string& path, const std::string& base) {
+    const bool isAbove = path.rfind("../", 0) == 0 || path.rfind("..\\", 0) == 0;
+    return isAbove || base.empty() ? std::string(HkFile::getcwd().c_str()) : base;
+}
+
+}  // namespace
+
+/// The input is a path and, behind its first line end, a base.
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    HkMessageManager::setHandler([](const HkMessage&, void*) {}, nullptr);
+    const std::string input(reinterpret_cast<const char*>(data), size);
+    const std::size_t end = input.find('\n');
+    const std::string path = input.substr(0, end).c_str();
+    const std::string base = end != std::string::npos ? input.substr(end + 1).c_str() : "";
+    std::string expected = path;
+    if (!isAbsolute(path)) {
+        expected = convertBySteps(path, rootOf(path, base)).value_or(path);
+    }
+    if (expected != FileUtility::convertPath(path.c_str(), base.c_str()).c_str()) {
+        std::abort();
+    }
+    return 0;
+}

@@ -1,0 +1,92 @@
+// What only this kind of host has: write protection of files, sharing, reparse points.
+#if defined(_WIN32)
+
+#include <gtest/gtest.h>
+#include <windows.h>
+
+#include <string>
+
+#include "HkFile.h"
+#include "TemporaryDirectory.h"
+
+namespace {
+
+void protect(const std::string& path) {
+    ASSERT_NE(SetFileAttributesA(path.c_str(), FILE_ATTRIBUTE_READONLY), 0);
+}
+
+TEST(TreeRemoval, RemovesProtectedFilesAndGoesOnPastThoseInUse) {
+    const TemporaryDirectory directory;
+    HkFile::mkdir((directory / "tree/sub/deep").c_str(), true);
+    protect(directory.write("tree/protected", ""));
+    const std::string used = directory.write("tree/sub/used", "");
+    directory.write("tree/sub/deep/free", "");
+    HANDLE const user = CreateFileA(used.c_str(), GENERIC_READ, 0, nullptr, OPEN_EXISTING, 0, nullptr);
+    ASSERT_NE(user, INVALID_HANDLE_VALUE);
+    EXPECT_FALSE(HkFile::rmtree((directory / "tree").c_str()));
+    EXPECT_TRUE(HkFile::exist(used.c_str()));
+    EXPECT_FALSE(HkFile::exist((directory / "tree/protected").c_str()));
+    EXPECT_FALSE(HkFile::exist((directory / "tree/sub/deep").c_str()));
+    CloseHandle(user);
+    EXPECT_TRUE(HkFile::rmtree((directory / "tree\\").c_str()));
+    EXPECT_FALSE(HkFile::exist((directory / "tree").c_str()));
+}
+
+TEST(TreeRemoval, RemovesDeepTrees) {
+    const TemporaryDirectory directory;
+    std::string path = directory / "deep";
+    for (int depth = 0; depth < 300; ++depth) {
+        ASSERT_TRUE(HkFile::mkdir(path.c_str(), false)) << depth;
+        path += "/dir";
+    }
+    EXPECT_TRUE(HkFile::rmtree((directory / "deep").c_str()));
+}
+
+// The runtime that the tests have shows links of its own host as reparse points, but cannot make or remove any.
+TEST(TreeRemoval, StopsAtReparsePoints) {
+    const TemporaryDirectory directory;
+    HkFile::mkdir((directory / "victim").c_str(), false);
+    HkFile::mkdir((directory / "tree").c_str(), false);
+    directory.write("victim/file", "kept");
+    const std::string link = directory / "tree/link";
+    if (CreateSymbolicLinkA(link.c_str(), (directory / "victim").c_str(), SYMBOLIC_LINK_FLAG_DIRECTORY) == 0 ||
+        !HkFile::exist(link.c_str())) {
+        char line[] = "Z:\\bin\\ln -s ../victim link";
+        STARTUPINFOA start{};
+        start.cb = sizeof start;
+        PROCESS_INFORMATION process{};
+        if (CreateProcessA(nullptr, line, nullptr, nullptr, FALSE, 0, nullptr, (directory / "tree").c_str(), &start,
+                           &process) != 0) {
+            WaitForSingleObject(process.hProcess, 10000);
+            CloseHandle(process.hThread);
+            CloseHandle(process.hProcess);
+        }
+        for (int i = 0; i < 100 && !HkFile::exist(link.c_str()); ++i) {
+            Sleep(20);  // a program of the other kind is not waited for
+        }
+    }
+    if (!HkFile::exist(link.c_str())) {
+        GTEST_SKIP() << "no link can be made here";
+    }
+    EXPECT_TRUE(HkFile::isdir(link.c_str()));
+    EXPECT_FALSE(HkFile::rmdir(link.c_str()));
+    HkFile::rmtree((directory / "tree").c_str());
+    HkFile::rmtree(link.c_str());
+    EXPECT_EQ(directory.read("victim/file"), "kept");
+}
+
+TEST(HkFileCopy, RefusesAProtectedDestination) {
+    const TemporaryDirectory directory;
+    const std::string source = directory.write("source", "new");
+    const std::string old = directory.write("old", "kept");
+    protect(old);
+    EXPECT_FALSE(HkFile::copy(source.c_str(), old.c_str()));
+    EXPECT_EQ(directory.read("old"), "kept");
+    EXPECT_TRUE(HkFile::remove_f(old.c_str()));
+    EXPECT_TRUE(HkFile::remove_f(source.c_str()));
+    EXPECT_TRUE(HkFile::rmdir(directory.path().c_str()));  // no temporary file is left
+}
+
+}  // namespace
+
+#endif
