@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # about: ./run carries out the demonstration, another script, and lines from standard input
-# needs:
+# needs: 
 # limit: 600
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
@@ -18,5 +18,5 @@ expect() {
     fi
 }
 expect 0 identify identify
-expect 1 1 "no_such_command"
+expect 1 "unknown command" no_such_command
 echo "lines from standard input, good and bad"
