@@ -4,6 +4,7 @@
 #include <cstring>
 
 #include "Help.h"
+#include "OptionCommands.h"
 #include "Session.h"
 
 namespace {
@@ -34,8 +35,9 @@ struct Row {
 };
 
 constexpr Row rows[] = {
-    {"help", help},
-    {"quit", quit},
+    {"custcode", showOptions},  {"erase", showOptions},   {"help", help},
+    {"preference", preference}, {"program", showOptions}, {"quit", quit},
+    {"readback", showOptions},  {"verify", showOptions},
 };
 
 }  // namespace

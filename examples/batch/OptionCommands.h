@@ -1,0 +1,11 @@
+// The commands that set options and preferences.
+#pragma once
+
+#include <TessalUtility.h>
+
+class Session;
+
+/// Sets the options of the device operation that the command names and shows the arguments that they make.
+bool showOptions(Session& session, const HkCmdArgs& args);
+/// Lists the preferences, shows one or sets one.
+bool preference(Session& session, const HkCmdArgs& args);
