@@ -13,6 +13,8 @@
 #include "DFCallback.h"
 #include "DataBuffer.h"
 #include "DataPath.h"
+#include "Access.h"
+#include "BitView.h"
 #include "DebugTrace.h"
 #include "DeviceOptionsMgr.h"
 #include "FileUtility.h"
