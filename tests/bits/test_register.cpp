@@ -10,7 +10,7 @@
 namespace {
 
 const unsigned char addressBytes[]{0xA5};
-const unsigned char dataBytes[]{0x3C};
+const unsigned char dataBytes[]{0x3C, 0x00};
 
 /// What prints while the call runs.
 template <class Call>
