@@ -6,6 +6,7 @@
 #include "Access.h"
 #include "AcdReader.h"
 #include "BitOperations.h"
+#include "BitView.h"
 #include "BrennwickInfo.h"
 #include "CableInfo.h"
 #include "Callback.h"

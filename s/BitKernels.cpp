@@ -212,6 +212,27 @@ void combine(unsigned char* target, const unsigned char* source, std::size_t cou
     }
 }
 
+#if TESSAL_HAS_WIDE
+/// Turns the bits of each byte round by looking up its halves; as many whole blocks as there are.
+TESSAL_WIDE std::size_t reverseBlocks(unsigned char* target, const unsigned char* source, std::size_t count) {
+    const __m256i turned = _mm256_broadcastsi128_si256(
+        _mm_setr_epi8(0x0, 0x8, 0x4, 0xC, 0x2, 0xA, 0x6, 0xE, 0x1, 0x9, 0x5, 0xD, 0x3, 0xB, 0x7, 0xF));
+    const __m256i half = _mm256_set1_epi8(0x0F);
+    std::size_t i = 0;
+    for (; i + sizeof(__m256i) <= count; i += sizeof(__m256i)) {
+        const __m256i bytes = _mm256_loadu_si256(reinterpret_cast<const __m256i*>(source + i));
+        const __m256i low = _mm256_shuffle_epi8(turned, _mm256_and_si256(bytes, half));
+        const __m256i high = _mm256_shuffle_epi8(turned, _mm256_and_si256(_mm256_srli_epi16(bytes, 4), half));
+        _mm256_storeu_si256(reinterpret_cast<__m256i*>(target + i), _mm256_or_si256(_mm256_slli_epi16(low, 4), high));
+    }
+    return i;
+}
+#else
+std::size_t reverseBlocks(unsigned char*, const unsigned char*, std::size_t) {
+    return 0;
+}
+#endif
+
 // ---- Searching in whole bytes.
 
 /// The number of leading bytes, in steps of eight words, that all equal the filler.
@@ -395,7 +416,8 @@ void complementBytes(unsigned char* target, const unsigned char* source, std::si
 }
 
 void reverseBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
-    combine<Logic::Reverse>(target, source, count);
+    const std::size_t done = hasWideVectors() ? reverseBlocks(target, source, count) : 0;
+    combineBody<Logic::Reverse, NarrowBlock>(target + done, source + done, count - done);
 }
 
 Word reverseBits(Word value, std::size_t count) {

@@ -120,6 +120,9 @@ Register::~Register() {
 }
 
 Register& Register::operator=(const Register& other) {
+    if (this == &other) {
+        return *this;
+    }
     assign(m_status, other.m_status);
     assign(m_data, other.m_data);
     assign(m_address, other.m_address);

@@ -15,6 +15,7 @@
 #if defined(__GNUC__) && defined(__x86_64__) && !defined(TESSAL_NO_WIDE_VECTORS)
 #define TESSAL_HAS_WIDE 1
 #define TESSAL_WIDE __attribute__((target("avx2")))
+#include <immintrin.h>
 #else
 #define TESSAL_HAS_WIDE 0
 #define TESSAL_WIDE
