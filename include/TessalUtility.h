@@ -14,6 +14,7 @@
 #include "DataBuffer.h"
 #include "DataPath.h"
 #include "Access.h"
+#include "BitView.h"
 #include "DebugTrace.h"
 #include "DeviceOptionsMgr.h"
 #include "FileUtility.h"
