@@ -163,7 +163,7 @@ std::unique_ptr<unsigned char[]> LRBitVec::replaceArray(std::size_t capacity, st
 
 void LRBitVec::setCapacity(std::size_t bits) {
     assert(bits >= m_numberBits);
-    replaceArray(bits, bits, bits);
+    replaceArray(bits, bits, 0);
     m_numberBits = std::min<std::size_t>(m_numberBits, bits);
 }
 

@@ -1,0 +1,139 @@
+// The plain bit vector that the fast ones are compared with: every rule bit by bit, nothing clever.
+#pragma once
+
+#include <algorithm>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+enum class Numbering { Storage, Usual, Forward, Mirrored };
+
+struct Model {
+    std::size_t capacity = 8;
+    std::size_t length = 0;
+    std::vector<unsigned char> bytes{0};
+    Numbering numbering = Numbering::Storage;
+
+    Model() = default;
+    Model(std::size_t bits, bool value)
+        : capacity(bits + 7), length(bits), bytes((bits + 14) / 8, value ? 0xFF : 0x00) {}
+
+    bool bit(std::size_t p) const { return (bytes.at(p / 8) >> (p % 8) & 1) != 0; }
+    void put(std::size_t p, bool value) {
+        unsigned char& byte = bytes.at(p / 8);
+        byte = static_cast<unsigned char>(value ? byte | 1 << (p % 8) : byte & ~(1 << (p % 8)));
+    }
+    std::size_t place(std::size_t index) const {
+        switch (numbering) {
+            case Numbering::Mirrored:
+                return index / 8 * 8 + (7 - index % 8);
+            case Numbering::Usual:
+                return length - 1 - index;
+            default:
+                return index;
+        }
+    }
+
+    void setCapacity(std::size_t bits) {
+        const std::size_t former = capacity;
+        capacity = bits;
+        bytes.resize((bits + 7) / 8, 0);
+        for (std::size_t p = former; bits > former && p % 8 != 0; ++p) {
+            put(p, false);
+        }
+    }
+    void addBit(bool value) {
+        if (capacity == 0) {
+            setCapacity(8);
+        }
+        if (length >= capacity - 1) {
+            setCapacity(2 * capacity);
+        }
+        put(length++, value);
+    }
+    void append(const Model& other) {
+        const std::size_t added = other.length;
+        const Model source = other;
+        setCapacity(length + added + 64);
+        for (std::size_t i = 0; i < added; ++i) {
+            addBit(source.bit(i));
+        }
+    }
+    void addHex(const std::string& text) {
+        const std::string digits = "0123456789abcdefABCDEF";
+        std::size_t value = std::string::npos;
+        for (const char character : text) {
+            const std::size_t found = digits.find(character);
+            value = found != std::string::npos ? (found < 16 ? found : found - 6) : value;
+            for (int bit = 3; bit >= 0 && value != std::string::npos; --bit) {
+                addBit((value >> bit & 1) != 0);
+            }
+        }
+    }
+    void setSize(std::size_t bits, bool value) {
+        length = bits;
+        for (std::size_t i = 0; i < bits; ++i) {
+            put(i, value);
+        }
+    }
+    void resize(std::size_t bits) {
+        length = bits;
+        if (bits > capacity) {
+            setCapacity(2 * bits);
+        }
+    }
+    void shiftUp(std::size_t n) {
+        for (std::size_t i = length; i-- > 0;) {
+            put(i, i >= n && bit(i - n));
+        }
+    }
+    void shiftDown(std::size_t n) {
+        for (std::size_t i = 0; i < length; ++i) {
+            put(i, i + n < length && bit(i + n));
+        }
+    }
+    void assign(const Model& other) {
+        if (bytes.empty() || other.bytes.empty()) {
+            return;
+        }
+        if (length != other.length) {
+            capacity = other.capacity;
+            length = other.length;
+            bytes.resize(other.bytes.size());
+        }
+        std::copy_n(other.bytes.begin(), std::min(bytes.size(), other.bytes.size()), bytes.begin());
+    }
+    template <class Operation>
+    void combine(const Model& other, Operation operation) {
+        for (std::size_t i = 0; i < (length + 7) / 8; ++i) {
+            bytes[i] = static_cast<unsigned char>(operation(bytes[i], other.bytes.at(i)));
+        }
+    }
+    std::size_t first(bool value) const {
+        for (std::size_t i = 0; i < length; ++i) {
+            if (bit(i) == value) {
+                return i;
+            }
+        }
+        return 0xFFFFFFFF;
+    }
+    bool equal(const Model& other) const {
+        bool same = length == other.length;
+        for (std::size_t i = 0; same && i < length; ++i) {
+            same = bit(i) == other.bit(i);
+        }
+        return same;
+    }
+    Model joined(const Model& other) const {
+        Model result(length + other.length, false);
+        for (std::size_t i = 0; i < result.length; ++i) {
+            result.put(result.length - 1 - i, i < length ? bit(place(i)) : other.bit(other.place(i - length)));
+        }
+        return result;
+    }
+    void field(std::size_t start, const std::vector<bool>& bits) {
+        for (std::size_t k = 0; k < bits.size(); ++k) {
+            put(place(length - start - 1 - k), bits[k]);
+        }
+    }
+};

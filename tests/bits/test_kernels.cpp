@@ -1,0 +1,140 @@
+// Every small run of bits, at every offset, in arrays of exactly its bytes, for both widths of block.
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <random>
+
+#include "Model.h"
+#include "s/BitKernels.h"
+#include "s/HexDigits.h"
+#include "s/WideVectors.h"
+
+namespace {
+
+using namespace BitKernels;
+
+class Kernels : public testing::TestWithParam<bool> {
+protected:
+    void SetUp() override { wideVectors = wideVectors && GetParam(); }
+    void TearDown() override { wideVectors = m_wide; }
+
+    /// An array that ends with the run.
+    Model array(std::size_t first, std::size_t count) {
+        Model model;
+        model.length = first + count;
+        model.bytes.resize((first + count + 7) / 8);
+        for (unsigned char& byte : model.bytes) {
+            byte = static_cast<unsigned char>(m_random());
+        }
+        return model;
+    }
+
+    static void eachRun(const std::function<void(std::size_t, std::size_t)>& check) {
+        for (std::size_t first = 0; first < 72; ++first) {
+            for (std::size_t count = 0; count < 136; ++count) {
+                check(first, count);
+            }
+        }
+    }
+
+    std::mt19937 m_random{5};
+
+private:
+    const bool m_wide = wideVectors;
+};
+
+TEST_P(Kernels, CopyBetweenArraysAndInsideOne) {
+    eachRun([this](std::size_t first, std::size_t count) {
+        for (const std::size_t from : {first, std::size_t{0}, std::size_t{5}, std::size_t{16}, std::size_t{71}}) {
+            const Model source = array(from, count);
+            Model target = array(first, count);
+            Model expected = target;
+            for (std::size_t i = 0; i < count; ++i) {
+                expected.put(first + i, source.bit(from + i));
+            }
+            copyBits(target.bytes.data(), first, source.bytes.data(), from, count);
+            ASSERT_EQ(target.bytes, expected.bytes) << count << " bits from " << from << " to " << first;
+
+            Model own = array(std::max(first, from), count);
+            expected = own;
+            for (std::size_t i = 0; i < count; ++i) {
+                expected.put(first + i, own.bit(from + i));
+            }
+            copyBits(own.bytes.data(), first, own.bytes.data(), from, count);
+            ASSERT_EQ(own.bytes, expected.bytes) << count << " bits inside, from " << from << " to " << first;
+        }
+    });
+}
+
+TEST_P(Kernels, FillFindCompareCountAndHash) {
+    eachRun([this](std::size_t first, std::size_t count) {
+        Model model = array(first, count);
+        for (const bool value : {false, true}) {
+            Model expected = model;
+            for (std::size_t i = first; i < first + count; ++i) {
+                expected.put(i, value);
+            }
+            Model filled = model;
+            fillBits(filled.bytes.data(), first, count, value);
+            ASSERT_EQ(filled.bytes, expected.bytes);
+            ASSERT_EQ(findBit(filled.bytes.data(), first, count, !value), first + count);
+            ASSERT_EQ(countOnes(filled.bytes.data(), first, count), value ? count : 0);
+            ASSERT_EQ(equalBits(filled.bytes.data(), model.bytes.data(), first, count),
+                      countOnes(model.bytes.data(), first, count) == (value ? count : 0));
+            if (count != 0) {
+                const std::size_t odd = first + m_random() % count;
+                const std::size_t hash = hashBits(filled.bytes.data(), first, count);
+                filled.put(odd, !value);
+                ASSERT_EQ(findBit(filled.bytes.data(), first, count, !value), odd);
+                ASSERT_FALSE(equalBits(filled.bytes.data(), expected.bytes.data(), first, count));
+                ASSERT_NE(hashBits(filled.bytes.data(), first, count), hash);
+            }
+        }
+    });
+}
+
+TEST_P(Kernels, WorkOnWholeBytesOfEveryCount) {
+    for (std::size_t count = 0; count < 200; ++count) {
+        const Model source = array(0, 8 * count);
+        Model reversed = source;
+        Model combined = source;
+        Model expected = source;
+        for (std::size_t i = 0; i < 8 * count; ++i) {
+            expected.put(i, source.bit(i ^ 7));
+        }
+        reverseBytes(reversed.bytes.data(), reversed.bytes.data(), count);
+        ASSERT_EQ(reversed.bytes, expected.bytes);
+        complementBytes(combined.bytes.data(), source.bytes.data(), count);
+        andBytes(combined.bytes.data(), source.bytes.data(), count);
+        ASSERT_EQ(combined.bytes, std::vector<unsigned char>(count, 0));
+        orBytes(combined.bytes.data(), source.bytes.data(), count);
+        ASSERT_EQ(combined.bytes, source.bytes);
+        xorBytes(combined.bytes.data(), source.bytes.data(), count);
+        ASSERT_EQ(combined.bytes, std::vector<unsigned char>(count, 0));
+    }
+}
+
+TEST_P(Kernels, DecodeHexUpToTheFirstForeignCharacter) {
+    const std::string digits = "0123456789abcdefABCDEF";
+    for (int foreign = 1; foreign < 256; ++foreign) {
+        const bool isDigit = digits.find(static_cast<char>(foreign)) != std::string::npos;
+        const std::size_t count = 64 + m_random() % 80;
+        const std::size_t at = m_random() % count;
+        std::string text(count, '0');
+        for (char& digit : text) {
+            digit = digits[m_random() % digits.size()];
+        }
+        text[at] = static_cast<char>(foreign);
+        std::vector<unsigned char> bytes(count / 2);
+        const std::size_t decoded = HexDigits::decodePairs(bytes.data(), text.data(), count);
+        ASSERT_EQ(decoded, (isDigit ? count : at) / 2 * 2) << foreign << " in " << text;
+        for (std::size_t i = 0; i < decoded; i += 2) {
+            ASSERT_EQ(bytes[i / 2], std::stoi(text.substr(i, 2), nullptr, 16));
+        }
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(Width, Kernels, testing::Bool(),
+                         [](const auto& width) { return width.param ? "Wide" : "Narrow"; });
+
+}  // namespace

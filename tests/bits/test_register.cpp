@@ -1,0 +1,178 @@
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "BitView.h"
+#include "EnvironmentVariable.h"
+#include "Register.h"
+
+namespace {
+
+const unsigned char addressBytes[]{0xA5};
+const unsigned char dataBytes[]{0x3C};
+
+/// What prints while the call runs.
+template <class Call>
+std::string printed(Call call) {
+    testing::internal::CaptureStdout();
+    call();
+    return testing::internal::GetCapturedStdout();
+}
+
+std::string line(const std::string& title, const std::string& storageBits) {
+    std::string text = title + "[\n  ";
+    for (const char bit : storageBits) {
+        text += std::string(1, bit) + ' ';
+    }
+    return text + "\n]\n\n";
+}
+
+std::string total(Register& reg) {
+    return toGroupedText(*reg.getRegister(), 0);
+}
+
+TEST(Register, JoinsItsPartsInIndexOrder) {
+    Register reg(8, addressBytes, 8, dataBytes, 4, 0x3);
+    EXPECT_EQ(total(reg),
+              "10100101"
+              "00111100"
+              "0011");
+    EXPECT_EQ(reg.getStatus(), 3);
+    EXPECT_EQ(reg.getRegisterSize(), 20);
+    reg.setStatus(0xFFFFFFFA);
+    const unsigned char other[]{0x81};
+    reg.setData(other, 8);
+    const RLBitVec address(8, true);
+    reg.setAddress(&address);
+    EXPECT_EQ(total(reg),
+              "11111111"
+              "10000001"
+              "1010");
+    EXPECT_EQ(toGroupedText(*reg.getStatus(true), 0), "1010");
+}
+
+TEST(Register, SplitsTheTotalOnlyWhenToldThatItChanged) {
+    Register reg(8, 8, 3);
+    *reg.getRegister() = RLBitVec(19, true);
+    EXPECT_EQ(reg.getData()[0], 0x00);
+    reg.updateData();
+    EXPECT_EQ(reg.getData()[0], 0xFF);
+    EXPECT_EQ(reg.getAddress()[0], 0xFF);
+    EXPECT_EQ(reg.getStatus(), 7);
+    reg.getStatus(false)->clearBit(0);
+    reg.updateTotalData();
+    EXPECT_EQ(total(reg),
+              "1111111111111111"
+              "011");
+}
+
+TEST(Register, OfDataAloneFollowsTheDatasLength) {
+    Register reg(0, nullptr, 8, dataBytes, 0, 0);
+    const RLBitVec longer(11, true);
+    reg.setData(&longer);
+    EXPECT_EQ(total(reg), "11111111111");
+    reg.getRegister()->resize(3);
+    reg.updateData();
+    EXPECT_EQ(reg.getDataVector()->length(), 3U);
+}
+
+TEST(Register, ReadsTheLow31BitsOfTheStatusWithSign) {
+    const struct {
+        int size;
+        unsigned int status;
+        int read;
+    } cases[]{{0, 5, 0},
+              {3, 5, 5},
+              {30, 0x3FFFFFFF, 0x3FFFFFFF},
+              {31, 0x40000000, -0x40000000},
+              {32, 0x80000001, 1},
+              {32, 0xFFFFFFFF, -1},
+              {40, 0x12345678, 0x12345678}};
+    for (const auto& [size, status, read] : cases) {
+        Register reg(4, 4, size);
+        reg.setStatus(status);
+        EXPECT_EQ(reg.getStatus(), read) << status << " in " << size << " bits";
+        if (size >= 32) {
+            EXPECT_EQ(reg.getStatus(true)->firstTrue(), static_cast<std::size_t>(__builtin_ctz(status)));
+        }
+    }
+}
+
+TEST(Register, ComparesWithoutTheStatus) {
+    Register a(8, addressBytes, 8, dataBytes, 5, 0x1F);
+    Register b(8, addressBytes, 8, dataBytes, 5, 0);
+    EXPECT_TRUE(a == b);
+    for (const std::size_t index : {0U, 7U, 8U, 15U}) {
+        Register c(8, addressBytes, 8, dataBytes, 5, 0);
+        (*c.getRegister())[index] ^= true;
+        EXPECT_FALSE(a == c) << index;
+    }
+    Register wider(8, addressBytes, 8, dataBytes, 3, 0);
+    EXPECT_FALSE(a == wider);
+    // Each side uses its own mask: the two bits that only the narrow one shows must meet zeros.
+    Register narrow(8, addressBytes, 10, dataBytes, 3, 0);
+    narrow.getRegister();
+    Register wide(8, addressBytes, 8, dataBytes, 5, 0x1F);
+    *narrow.getRegister() = *wide.getRegister();
+    EXPECT_FALSE(narrow == wide);
+    narrow.getRegister()->clearBit(16);
+    narrow.getRegister()->clearBit(17);
+    EXPECT_TRUE(narrow == wide);
+}
+
+TEST(Register, KeepsItsMaskInAnAssignment) {
+    Register a(8, addressBytes, 8, dataBytes, 0, 0);
+    Register b(8, addressBytes, 4, dataBytes, 4, 0xF);
+    a = b;
+    EXPECT_EQ(a.getStatusSize(), 4);
+    EXPECT_EQ(a.getStatus(), 15);
+    b.setStatus(1);
+    EXPECT_FALSE(a == b) << "the mask of a hides nothing";
+}
+
+TEST(Register, PrintsWhatStands) {
+    Register reg(2, 3, 2);
+    const RLBitVec data(3, true);
+    reg.setData(&data);
+    EXPECT_EQ(printed([&] { reg.registerDisplay(); }), line("Register: ", "0000000"));
+    EXPECT_EQ(printed([&] { reg.display(); }), line("Address: ", "00") + line("Data: ", "111") +
+                                                   line("Status: ", "00") + line("Total Register", "0011100"));
+    EXPECT_EQ(printed([&] { reg.setStatus(3); }), "");
+}
+
+TEST(Register, DumpsItsWorkWhenTheVariableIsSet) {
+    EnvironmentVariable variable("TESSALREGISTERDUMPDATA", "off");
+    Register a(1, 1, 1);
+    Register alone(0, 2, 0);
+    variable.set(nullptr);
+    Register b(1, 1, 1);
+    EXPECT_EQ(printed([&] { a.setStatus(1); }), line("status: ", "1"));
+    EXPECT_EQ(printed([&] { a == a; }), "");
+    EXPECT_EQ(printed([&] { a == b; }), line("Operand1 data ", "000") + line("Mask ", "011") +
+                                            line("Operand2 data ", "000") + line("Mask ", "011") + line("&", "000") +
+                                            line("&", "000") + "ReCalculating ...\n" + line("", "100"));
+    alone.updateTotalData();
+    EXPECT_EQ(printed([&] { alone.getRegister(); }),
+              "ReCalculating ...\n"
+              "Address and status are zero,using Data to populate totalData, no recalculating ...\n" +
+                  line("", "00"));
+}
+
+TEST(Register, WithoutVectorsAnswersWithNothing) {
+    Register source(8, addressBytes, 8, dataBytes, 4, 3);
+    Register empty(source);
+    Register other;
+    empty = source;
+    empty.setStatus(3);
+    empty.setAddress(nullptr);
+    empty.updateData();
+    EXPECT_EQ(empty.getRegisterSize() + empty.getStatus(), 0);
+    EXPECT_EQ(empty.getData(), nullptr);
+    EXPECT_EQ(empty.getStatus(true), nullptr);
+    EXPECT_FALSE(empty == source);
+    EXPECT_FALSE(source == other);
+    EXPECT_NE(printed([&] { empty.display(); }), "");
+}
+
+}  // namespace

@@ -1,0 +1,181 @@
+// What the random operations do not reach: construction, printing, views, refused sizes, and examples worked by hand.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <new>
+#include <sstream>
+
+#include "BitView.h"
+#include "HkFile.h"
+#include "HkStream.h"
+#include "MessageRecorder.h"
+
+namespace {
+
+using testing::ElementsAre;
+
+template <class Vector>
+Vector from(const char* storageBits) {
+    Vector vector;
+    for (; *storageBits != '\0'; ++storageBits) {
+        vector.addBit(*storageBits == '1');
+    }
+    return vector;
+}
+
+std::string storage(const LRBitVec& vector) {
+    return toGroupedText(vector, 0);
+}
+
+template <class Vector>
+class BothVectors : public testing::Test {};
+using Vectors = testing::Types<LRBitVec, RLBitVec>;
+TYPED_TEST_SUITE(BothVectors, Vectors, );
+
+TYPED_TEST(BothVectors, HaveTheSizesOfTheirConstruction) {
+    const unsigned char bytes[]{0xA1, 0x0F, 0xFF};
+    const TypeParam none;
+    const TypeParam empty(0);
+    const TypeParam ones(9, true);
+    const TypeParam read(bytes, 12);
+    const TypeParam zeros(nullptr, 12);
+    EXPECT_THAT((std::vector<std::size_t>{none.length(), none.getCapacity(), none.nbytes(), none.nfull()}),
+                ElementsAre(0, 8, 1, 1));
+    EXPECT_THAT((std::vector<std::size_t>{empty.getNumberBytes(), empty.getCapacity(), empty.nbytes(), empty.nfull()}),
+                ElementsAre(0, 7, 1, 0));
+    EXPECT_EQ(ones.getCapacity(), 16U);
+    EXPECT_EQ(ones.data()[1], 0xFF);
+    EXPECT_EQ(hexDump(read), "       0  a1 0f\n");
+    EXPECT_EQ(zeros.count(), 0U);
+    EXPECT_EQ(none.firstTrue(), 0xFFFFFFFFU);
+    EXPECT_EQ(from<TypeParam>("11111111").firstFalse(), 0xFFFFFFFFU);
+}
+
+TYPED_TEST(BothVectors, LeaveAnEmptyVectorBehindAMove) {
+    TypeParam source = from<TypeParam>("10110");
+    TypeParam target(std::move(source));
+    EXPECT_EQ(storage(target), "10110");
+    EXPECT_EQ(source.getCapacity() + source.length(), 0U);  // NOLINT(bugprone-use-after-move)
+    EXPECT_EQ(TypeParam(source).data(), nullptr);
+    source = target;
+    EXPECT_EQ(source.length(), 0U) << "without an array nothing is assigned";
+    source.addBit(true);
+    EXPECT_EQ(source.getCapacity(), 8U);
+}
+
+TYPED_TEST(BothVectors, RefuseSizesThatCannotBe) {
+    const std::size_t huge = ~std::size_t{0};
+    TypeParam vector = from<TypeParam>("101");
+    EXPECT_THROW(TypeParam{huge}, std::bad_array_new_length);
+    EXPECT_THROW(vector.resize(huge / 2 + 1), std::bad_array_new_length);
+    EXPECT_THROW(vector.setCapacity(huge), std::bad_array_new_length);
+    vector += static_cast<const char*>(nullptr);
+    vector.addHex(std::string_view());
+    EXPECT_EQ(storage(vector), "101");
+#ifdef NDEBUG
+    vector.setNumberBits(9);
+    vector.setSize(9, true);
+    EXPECT_EQ(storage(vector), "101");
+    vector ^= TypeParam(0);
+    vector.rightShift(1000);
+    EXPECT_EQ(storage(vector), "000");
+    vector.setCapacity(2);
+    EXPECT_EQ(vector.length(), 2U);
+#endif
+}
+
+TYPED_TEST(BothVectors, PrintFromStoragePositionZeroUp) {
+    MessageRecorder recorder;
+    TypeParam vector = from<TypeParam>("100101");
+    vector.printData(false, 3);
+    EXPECT_THAT(recorder.status(),
+                ElementsAre("[\n", "  ", "1 ", "0 ", "0 ", "\n  ", "1 ", "0 ", "1 ", "\n  ", "\n]\n"));
+    recorder.clear();
+    vector.printData(true, 5);
+    EXPECT_THAT(recorder.status(), ElementsAre("[\n", "  "));
+    EXPECT_THAT(recorder.debug(), ElementsAre("1 ", "0 ", "0 ", "1 ", "0 ", "\n  ", "1 ", "\n]\n"));
+
+    std::ostringstream stream;
+    testing::internal::CaptureStdout();
+    HkFile::getCout() << TypeParam(26, true);
+    stream << TypeParam(26, true);
+    std::string line;
+    for (int i = 0; i < 25; ++i) {
+        line += "1 ";
+    }
+    EXPECT_EQ(testing::internal::GetCapturedStdout(), "[\n  " + line + "\n  1 \n]\n");
+    EXPECT_EQ(stream.str(), "[\n  " + line + "\n  1 \n]\n");
+}
+
+TEST(RLBitVec, AppendsBehindItsRightEnd) {
+    RLBitVec vector;
+    vector += from<RLBitVec>("101");
+    EXPECT_EQ(storage(vector), "101");
+    const RLBitVec left = from<RLBitVec>("1100");
+    RLBitVec joined(left);
+    joined += vector;
+    EXPECT_EQ(storage(joined), "1011100");
+    EXPECT_EQ(joined.getCapacity(), 14U);
+    joined += joined;
+    joined += RLBitVec();
+    EXPECT_EQ(storage(joined), "10111001011100");
+}
+
+TEST(RLBitVec, ShiftsAndComplementsByItsOwnOperators) {
+    RLBitVec vector = from<RLBitVec>("1101001");
+    vector << 2;
+    EXPECT_EQ(storage(vector), "0011010");
+    vector >> 3;
+    EXPECT_EQ(storage(vector), "1010000");
+    EXPECT_EQ(storage(!static_cast<const RLBitVec&>(vector)), "0101111");
+    EXPECT_EQ(storage(vector & from<RLBitVec>("1100000")), "1000000");
+    vector = true;
+    EXPECT_EQ(vector.data()[0], 0xFF);
+}
+
+TEST(RLBitVec, TakesFieldsAsTextAndRefusesThoseThatDoNotFit) {
+    RLBitVec vector(16);
+    vector.updateBitField("1x11", 2);
+    vector.updateBitField("", 2);
+    vector.updateBitField(static_cast<const char*>(nullptr), 2);
+    vector.updateBitField(static_cast<const char*>(nullptr), 2, 8, true);
+    vector.updateBitField(static_cast<const RLBitVec*>(nullptr), 2, true);
+    vector.updateBitField(0xFFU, 3, -1, true);
+#ifdef NDEBUG
+    vector.updateBitField(0xFFU, -1, 4, true);
+    vector.updateBitField(0xFFU, 20, 4, true);
+    vector.updateBitField(0xFFU, 0, 33, true);
+    vector.updateBitField("111111111111111111111111111111111", 0);
+#endif
+    EXPECT_EQ(storage(vector), "0010110000000000");
+}
+
+TEST(BitView, ShowsGroupsDumpsAndDifferences) {
+    const auto left = from<LRBitVec>("1010010111");
+    const auto right = from<LRBitVec>("1000010110");
+    EXPECT_EQ(toGroupedText(left), "1010_0101_11");
+    EXPECT_EQ(toGroupedText(RLBitVec(left)), "11_1010_0101");
+    EXPECT_EQ(toGroupedText(left, 5, ' '), "10100 10111");
+    EXPECT_EQ(hexDump(LRBitVec(130, true)),
+              "       0  ff ff ff ff ff ff ff ff ff ff ff ff ff ff ff ff\n     128  03\n");
+    EXPECT_EQ(hexDump(LRBitVec()), "");
+    EXPECT_EQ(difference(left, left), "");
+    EXPECT_EQ(difference(left, right),
+              "2 of 10 bits differ\n       0  1010010111\n          1000010110\n            ^      ^\n");
+    EXPECT_EQ(difference(LRBitVec(64), LRBitVec(66)),
+              "2 of 66 bits differ\n      64  --\n          00\n          ^^\n");
+}
+
+#ifndef NDEBUG
+TEST(BitVecDeathTest, AssertsTheLimitsOfTheCaller) {
+    RLBitVec vector(9);
+    EXPECT_DEATH(vector.setBit(9), "holdsPosition");
+    EXPECT_DEATH(vector.setNumberBits(17), "length <= m_capacity");
+    EXPECT_DEATH(vector.setCapacity(8), "bits >= m_numberBits");
+    EXPECT_DEATH(vector >> 10, "count <= m_numberBits");
+    EXPECT_DEATH(vector &= LRBitVec(8), "m_numberBits >= m_numberBits");
+    EXPECT_DEATH(vector.updateBitField(1U, 13, 4, true), "holds");
+}
+#endif
+
+}  // namespace
