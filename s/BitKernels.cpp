@@ -2,6 +2,7 @@
 
 #include <functional>
 
+#include "s/ByteTables.h"
 #include "s/WideVectors.h"
 
 namespace BitKernels {
@@ -153,9 +154,9 @@ void copyWholeBytes(unsigned char* target, const unsigned char* source, std::siz
 
 // ---- Logic on whole bytes.
 
-enum class Logic { And, Or, Xor, Complement, Reverse };
+enum class Logic { And, Or, Xor, Complement };
 
-/// A value of any width combined; Reverse turns the bits of each byte round.
+/// A value of any width combined.
 template <Logic logic, class Value>
 TESSAL_INLINE_BODY void combineValue(Value& target, const Value& source) {
     if constexpr (logic == Logic::And) {
@@ -164,12 +165,8 @@ TESSAL_INLINE_BODY void combineValue(Value& target, const Value& source) {
         target |= source;
     } else if constexpr (logic == Logic::Xor) {
         target ^= source;
-    } else if constexpr (logic == Logic::Complement) {
-        target = ~source;
     } else {
-        target = (source >> 4 & 0x0F0F0F0F0F0F0F0FU) | (source & 0x0F0F0F0F0F0F0F0FU) << 4;
-        target = (target >> 2 & 0x3333333333333333U) | (target & 0x3333333333333333U) << 2;
-        target = (target >> 1 & 0x5555555555555555U) | (target & 0x5555555555555555U) << 1;
+        target = ~source;
     }
 }
 
@@ -394,17 +391,11 @@ void complementBytes(unsigned char* target, const unsigned char* source, std::si
     combine<Logic::Complement>(target, source, count);
 }
 
-void reverseBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
-    combine<Logic::Reverse>(target, source, count);
-}
-
 Word reverseBits(Word value, std::size_t count) {
     if (count == 0) {
         return 0;
     }
-    Word reversed = 0;
-    combineValue<Logic::Reverse>(reversed, value);
-    return __builtin_bswap64(reversed) >> (wordBits - count);
+    return __builtin_bswap64(ByteTables::mirrorEachByte(value)) >> (wordBits - count);
 }
 
 }  // namespace BitKernels
