@@ -51,7 +51,7 @@ void sumByAccumulate(benchmark::State& state) {
     }
 }
 
-#if defined(__x86_64__) && !defined(_WIN32)
+#if defined(__x86_64__)
 typedef long long Quad __attribute__((vector_size(32)));
 typedef char Bytes __attribute__((vector_size(32)));
 

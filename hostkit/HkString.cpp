@@ -195,12 +195,15 @@ HkString& HkString::operator=(const HkString& other) {
 }
 
 HkString& HkString::Format(const char* format, ...) {
+    if (format == nullptr) {
+        Empty();
+        return *this;
+    }
     char shortText[128];
     std::va_list arguments;
     std::va_list again;
     va_start(arguments, format);
     va_copy(again, arguments);
-    format = format != nullptr ? format : "";
     const int written = std::vsnprintf(shortText, sizeof shortText, format, arguments);
     const std::size_t length = written > 0 ? static_cast<std::size_t>(written) : 0;
     if (length < sizeof shortText) {

@@ -235,7 +235,9 @@ TESSAL_API HostKit::HkStream& operator<<(HostKit::HkStream& stream, LRBitVec vec
 TESSAL_API std::ostream& operator<<(std::ostream& stream, const LRBitVec& vector);
 
 /// Vectors that are equal have the same hash; the slack does not count.
+/// @cond
 template <>
 struct TESSAL_API std::hash<LRBitVec> {
     std::size_t operator()(const LRBitVec& vector) const noexcept;
 };
+/// @endcond

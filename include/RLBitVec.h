@@ -113,5 +113,7 @@ TESSAL_API RLBitVec operator&(const RLBitVec& a, const RLBitVec& b);
 /// A new vector of the same length and the usual numbering whose bytes are the complements.
 TESSAL_API RLBitVec operator!(const RLBitVec& vector);
 
+/// @cond
 template <>
 struct TESSAL_API std::hash<RLBitVec> : std::hash<LRBitVec> {};
+/// @endcond

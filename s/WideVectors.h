@@ -33,7 +33,9 @@ using WideBlock = NarrowBlock;
 /// Whether the processor has what functions marked TESSAL_WIDE need. Tests clear it to run the narrow form.
 extern bool wideVectors;
 
-inline bool hasWideVectors() { return wideVectors; }
+inline bool hasWideVectors() {
+    return wideVectors;
+}
 
 template <class Block>
 TESSAL_INLINE_BODY void loadBlock(Block& block, const void* bytes) {

@@ -93,7 +93,7 @@ void Attachment::detach() {
 }
 
 void Attachment::set(const char* name, std::int32_t initial, std::int32_t maximum) const {
-    std::strncpy(m_segment->name, name, CountSegment::nameSize);
+    std::memcpy(m_segment->name, name, std::strlen(name) + 1);  // it fits: NamedSemaphore takes no longer one
     m_segment->maximum = maximum;
     m_segment->count.store(initial, std::memory_order_relaxed);
     m_segment->sign = CountSegment::ourSign;

@@ -66,7 +66,10 @@ public:
 
     std::int64_t write(Pipe pipe, const char* data, int length) override {
         DWORD moved = 0;
-        return WriteFile(asHandle(pipe), data, static_cast<DWORD>(length), &moved, nullptr) != 0 ? moved : -1;
+        if (WriteFile(asHandle(pipe), data, static_cast<DWORD>(length), &moved, nullptr) == 0) {
+            return -1;
+        }
+        return moved;
     }
 
     void close(Pipe pipe) override { CloseHandle(asHandle(pipe)); }

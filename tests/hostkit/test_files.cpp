@@ -13,6 +13,14 @@
 #include "HkPath.h"
 #include "TemporaryDirectory.h"
 
+// The sanitizers end a program that asks for more than there is, unless they are told to refuse as the hosts do.
+extern "C" const char* __asan_default_options() {  // NOLINT(bugprone-reserved-identifier): their name for it
+    return "allocator_may_return_null=1";
+}
+extern "C" const char* __tsan_default_options() {  // NOLINT(bugprone-reserved-identifier): their name for it
+    return "allocator_may_return_null=1";
+}
+
 namespace {
 
 const std::string unicodeName = "g\xc3\xa4nsef\xc3\xbc\xc3\x9f\xe2\x82\xac.txt";

@@ -11,8 +11,8 @@ step "doxygen" bash -c "cd '$root' && doxygen docs/Doxyfile"
 broken=0
 cd "$root"
 for page in *.md docs/*.md; do
-    # Links to files of this tree only: no scheme, no place within the same page.
-    for link in $(grep -oE '\]\([^)#: ]+' "$page" | cut -c3-); do
+    # Links to files of this tree only: no scheme, no place within the same page, none in a block of code.
+    for link in $(sed '/^```/,/^```/d' "$page" | grep -oE '\]\([^)#: ]+' | cut -c3-); do
         [ -e "$(dirname "$page")/$link" ] || { echo "$page: no such file: $link" >&2; broken=1; }
     done
 done

@@ -1,0 +1,182 @@
+// Setting up and failing to: ports, names, attempts, messages.
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <string>
+
+#include "MessageRecorder.h"
+#include "tests/transport/Links.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::StartsWith;
+
+TEST(SocketSetup, APortInUseIsRefused) {
+    int port = 0;
+    const std::unique_ptr<TessalSocket> server = listeningServer(port);
+    ASSERT_NE(server, nullptr);
+    const MessageRecorder messages;
+    TessalSocket second(0, nullptr, port);
+    EXPECT_FALSE(second.initialize());
+    EXPECT_THAT(messages.status(), ElementsAre(StartsWith(" bind() failed: ")));
+}
+
+TEST(SocketSetup, AServerThatIsNotUpIsToldOnce) {
+    const MessageRecorder messages;
+    TessalSocket client(1, "127.0.0.1", 1);
+    EXPECT_FALSE(client.initialize());
+    EXPECT_THAT(messages.all(), IsEmpty());
+    EXPECT_FALSE(client.connectToServer());
+    EXPECT_THAT(messages.status(), ElementsAre(StartsWith(" connect() failed: ")));
+    EXPECT_NE(client.getClientSocketFd(), TessalSocket::noSocket) << "the socket of the last attempt";
+    EXPECT_TRUE(client.deinitialize());
+    EXPECT_EQ(client.getClientSocketFd(), TessalSocket::noSocket);
+}
+
+/// A host whose calls fail from the n-th on.
+class FailingHost : public ByteByByteHost {
+public:
+    bool startFails = false;
+    bool openFails = false;
+    bool resolveFails = false;
+    bool closeFails = false;
+    int connectsBeforeSuccess = 0;
+    int attempts = 0;
+    int pauses = 0;
+    int started = 0;
+
+    bool start() override {
+        started += startFails ? 0 : 1;
+        return !startFails;
+    }
+    void stop() override { --started; }
+    platform::Socket openClient() override { return openFails ? platform::noSocket : 7; }
+    bool resolve(const char*, std::uint16_t, platform::SocketAddress&) override {
+        ++attempts;
+        return !resolveFails;
+    }
+    bool connect(platform::Socket, const platform::SocketAddress&) override { return attempts > connectsBeforeSuccess; }
+    bool close(platform::Socket) override { return !closeFails; }
+    void pause(int milliseconds) override { pauses += milliseconds; }
+};
+
+class ScriptedSocket : public testing::Test {
+protected:
+    ScriptedSocket() { platform::replaceSocketHost(&host); }
+    ~ScriptedSocket() override {
+        client.reset();
+        platform::replaceSocketHost(nullptr);
+    }
+
+    FailingHost host;
+    std::unique_ptr<TessalSocket> client = std::make_unique<TessalSocket>(1, "server", 5);
+    MessageRecorder messages;
+};
+
+TEST_F(ScriptedSocket, TenAttemptsAreMadeBehindOnePause) {
+    host.connectsBeforeSuccess = 9;
+    EXPECT_TRUE(client->connectToServer());
+    EXPECT_EQ(host.attempts, 10);
+    EXPECT_EQ(host.pauses, 50);
+    EXPECT_THAT(messages.all(), IsEmpty());
+    host.connectsBeforeSuccess = 100;
+    host.closeFails = true;
+    EXPECT_FALSE(client->connectToServer());
+    EXPECT_EQ(host.attempts, 20);
+    EXPECT_EQ(messages.status().size(), 11U);
+    EXPECT_EQ(messages.status().front(), " closesocket() failed: 104\n");
+    EXPECT_EQ(messages.status().back(), " connect() failed: 104\n");
+}
+
+TEST_F(ScriptedSocket, EachStepThatFailsIsTold) {
+    host.startFails = true;
+    EXPECT_FALSE(client->initialize());
+    host.startFails = false;
+    host.openFails = true;
+    EXPECT_FALSE(client->initialize());
+    host.openFails = false;
+    host.resolveFails = true;
+    EXPECT_FALSE(client->initialize());
+    EXPECT_THAT(messages.status(), ElementsAre("Failed to load Winsock!\n", " socket() failed: 104\n",
+                                               "Unable to resolve server: server\n"));
+    EXPECT_TRUE(client->deinitialize());
+    EXPECT_TRUE(client->deinitialize());
+    EXPECT_EQ(host.started, 0) << "stopped as often as started";
+    messages.clear();
+    EXPECT_FALSE(client->connectToServer());
+    EXPECT_EQ(messages.status().size(), 11U) << "each of ten attempts, and the end";
+}
+
+TEST(SocketSetup, ANameThatIsTooLongIsNoName) {
+    const MessageRecorder messages;
+    TessalSocket client(1, std::string(128, 'x').c_str(), 1);
+    EXPECT_FALSE(client.initialize());
+    EXPECT_THAT(messages.status(), ElementsAre("Unable to resolve server: \n"));
+    char count[] = "abx";
+    client.setBufferCount(count, 0x12345);
+    EXPECT_STREQ(count, "\x45\x23x");
+    client.setBufferCount(nullptr, 1);
+}
+
+TEST(PipeSetup, AClientWithoutServerFailsAtOnce) {
+    MessageRecorder messages;
+    TessalPipe client(1, freshPipeName().c_str());
+    EXPECT_TRUE(client.connectToServer()) << "says nothing about a connection";
+    EXPECT_FALSE(client.initialize());
+    EXPECT_THAT(messages.debug(), ElementsAre(StartsWith(" Create pipe failed, status = ")));
+    EXPECT_FALSE(client.waitForClient());
+    messages.clear();
+    EXPECT_FALSE(client.readSocket(nullptr, 1));
+    char byte = 0;
+    EXPECT_FALSE(client.readSocket(&byte, 1));
+    EXPECT_FALSE(client.writeSocket(&byte, 1));
+    EXPECT_EQ(client.writeString(client.getClientSocketFd(), "abc"), 3);
+    const std::vector<std::string> status = messages.status();
+    ASSERT_EQ(status.size(), 9U);
+    EXPECT_THAT(status[2], StartsWith("ReadFile failed: "));
+    EXPECT_THAT(status[3], StartsWith(" read : "));
+    EXPECT_THAT(status[4], StartsWith("WriteFile failed: "));
+    EXPECT_THAT(status[5], StartsWith(" write : "));
+    EXPECT_EQ(status[8], "TessalSocket::writeString error.\n");
+}
+
+TEST(PipeSetup, ASecondServerLeavesTheFirstAlone) {
+    const std::string name = freshPipeName();
+    TessalPipe first(0, name.c_str());
+    ASSERT_TRUE(first.initialize());
+    TessalPipe second(0, name.c_str());
+    EXPECT_TRUE(second.initialize()) << "the pipe is there";
+    EXPECT_NE(first.getClientSocketFd(), second.getClientSocketFd());
+    EXPECT_FALSE(second.waitForClient());
+
+    TessalPipe client(1, name.c_str());
+    ASSERT_TRUE(client.initialize());
+    EXPECT_TRUE(first.waitForClient()) << "a client that was quicker";
+    EXPECT_TRUE(first.waitForClient());
+    TessalPipe late(1, name.c_str());
+    EXPECT_FALSE(late.initialize()) << "one client for a server end";
+    EXPECT_EQ(client.writeInt(client.getClientSocketFd(), 5), 4);
+    int value = 0;
+    first.readInt(first.getClientSocketFd(), &value);
+    EXPECT_EQ(value, 5) << "looking for the pipe was no client";
+    EXPECT_TRUE(first.close(nullptr));
+    EXPECT_TRUE(first.close(nullptr));
+    TessalPipe third(0, name.c_str());
+    EXPECT_TRUE(third.initialize());
+    EXPECT_NE(third.getClientSocketFd(), second.getClientSocketFd()) << "the name is free again";
+}
+
+TEST(PipeSetup, NamesThatAreNoneAreRefused) {
+    const std::string names[] = {"", "\\\\.\\pipe\\", std::string(128, 'x'), "\\\\.\\pipe\\" + std::string(120, 'y')};
+    for (const std::string& name : names) {
+        SCOPED_TRACE(name);
+        EXPECT_FALSE(TessalPipe(0, name.c_str()).initialize());
+        EXPECT_FALSE(TessalPipe(1, name.c_str()).initialize());
+    }
+    EXPECT_FALSE(TessalPipe(1, nullptr).initialize());
+}
+
+}  // namespace
