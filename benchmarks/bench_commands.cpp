@@ -3,12 +3,18 @@
 #include <getopt.h>
 
 #include <cstdlib>
+#include <filesystem>
+#include <fstream>
 #include <map>
+#include <memory>
 #include <stdexcept>
 #include <string>
 #include <vector>
 
+#include "CommandSet.h"
+#include "DataPath.h"
 #include "HkCmdArgs.h"
+#include "TessalCmdargs.h"
 #include "benchmarks/Item.h"
 
 #if __has_include(<CLI/CLI.hpp>)
@@ -61,21 +67,45 @@ struct Checked {
 
 // Ours.
 
-HkCmdArgs parseByOurs(const std::vector<const char*>& command) {
-    const auto found = formats().find(command[0]);
-    return HkCmdArgs(static_cast<int>(command.size()), command.data(), found->second.c_str(), nullptr, 0);
+/// Fills the table of commands from a data file with the rows of formats().
+void loadCommands() {
+    const std::filesystem::path directory = std::filesystem::temp_directory_path() / "tessal_bench_commands";
+    std::filesystem::create_directories(directory);
+    std::string rows;
+    for (const auto& [name, format] : formats()) {
+        rows += (rows.empty() ? "" : ":") + name + ",TRUE," + format;
+    }
+    std::ofstream(directory / "tessal.acd") << "[base]\nCOMMAND_FORMAT = " << rows << "\n";
+    DeviceProfile::setDataPath(directory.string().c_str());
+    TessalCmdargs::createCommandMap();
+    DeviceProfile::setDataPath(nullptr);
+    std::filesystem::remove_all(directory);
+}
+
+std::unique_ptr<HkCmdArgs> parseByOurs(CommandSet& command) {
+    return std::unique_ptr<HkCmdArgs>(
+        TessalCmdargs::getCmdargs(command.getNumberCommands(), command.getCommands(), true));
+}
+
+CommandSet commandSet() {
+    CommandSet command;
+    for (const char* const word : words(false)) {
+        command.addCommand(word);
+    }
+    return command;
 }
 
 Checked readByOurs() {
-    const HkCmdArgs args = parseByOurs(words(false));
+    CommandSet command = commandSet();
+    const std::unique_ptr<HkCmdArgs> args = parseByOurs(command);
     Checked checked;
-    for (int i = 0; i < args.valueCount("-p"); ++i) {
-        checked.positions.push_back(args.integer("-p", i));
+    for (int i = 0; i < args->valueCount("-p"); ++i) {
+        checked.positions.push_back(args->integer("-p", i));
     }
-    checked.erase = args.isGiven("-e");
-    checked.verify = args.isGiven("-v");
-    checked.usercode = args.hex("-u");
-    checked.file = args.text("-file");
+    checked.erase = args->isGiven("-e");
+    checked.verify = args->isGiven("-v");
+    checked.usercode = args->hex("-u");
+    checked.file = args->text("-file");
     return checked;
 }
 
@@ -83,11 +113,11 @@ void requireAgreement();
 
 void ours(benchmark::State& state) {
     requireAgreement();
-    std::vector<const char*> command = words(false);
+    CommandSet command = commandSet();
     for (auto step : state) {
-        benchmark::DoNotOptimize(command.data());
-        const HkCmdArgs args = parseByOurs(command);
-        unsigned char error = args.iserror();
+        benchmark::DoNotOptimize(command.getCommands());
+        const std::unique_ptr<HkCmdArgs> args = parseByOurs(command);
+        unsigned char error = args->iserror();
         benchmark::DoNotOptimize(error);
     }
 }
@@ -199,6 +229,7 @@ bool agreesWithPeers(const Checked&) {
 /// All sides read the same command; asked once, before the clock runs.
 void requireAgreement() {
     static const bool agrees = [] {
+        loadCommands();
         const std::vector<char*> command = mutableWords();
         const Checked checked = readByOurs();
         return checked == parseByGetopt(command.data(), static_cast<int>(command.size())) && agreesWithPeers(checked);
@@ -208,6 +239,7 @@ void requireAgreement() {
     }
 }
 
-const RegisterItem command{{"parse_command", {"HkCmdArgs", ours}, peers(), {"map, getopt_long", limit}, 0.25, 4.00}};
+const RegisterItem command{
+    {"parse_command", {"TessalCmdargs", ours}, peers(), {"map, getopt_long", limit}, 0.25, 4.00}};
 
 }  // namespace

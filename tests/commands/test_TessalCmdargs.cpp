@@ -3,8 +3,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <filesystem>
-#include <fstream>
 #include <memory>
 #include <string>
 #include <vector>
@@ -12,6 +10,7 @@
 #include "CommandSet.h"
 #include "DataPath.h"
 #include "MessageRecorder.h"
+#include "TemporaryDirectory.h"
 #include "TessalException.h"
 
 namespace {
@@ -19,24 +18,19 @@ namespace {
 using testing::ElementsAre;
 using testing::IsSupersetOf;
 
-/// A data directory of its own, with these rows of commands, as long as it lives.
+/// Data files with these rows of commands, looked at as long as it lives.
 class CommandData {
 public:
     explicit CommandData(const std::string& rows) {
-        std::filesystem::create_directories(m_directory);
-        std::ofstream(m_directory / "tessal.acd") << "[base]\n" << rows << "\n";
-        DeviceProfile::setDataPath(m_directory.string().c_str());
+        m_directory.write("tessal.acd", "[base]\n" + rows + "\n");
+        DeviceProfile::setDataPath(m_directory.path().c_str());
     }
-    ~CommandData() {
-        DeviceProfile::setDataPath(nullptr);
-        std::filesystem::remove_all(m_directory);
-    }
+    ~CommandData() { DeviceProfile::setDataPath(nullptr); }
     CommandData(const CommandData&) = delete;
     CommandData& operator=(const CommandData&) = delete;
 
 private:
-    std::filesystem::path m_directory =
-        std::filesystem::path(testing::TempDir()) / testing::UnitTest::GetInstance()->current_test_info()->name();
+    TemporaryDirectory m_directory;
 };
 
 std::unique_ptr<HkCmdArgs> parse(const char* line, bool strict) {
