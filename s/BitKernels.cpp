@@ -2,6 +2,7 @@
 
 #include <functional>
 
+#include "s/ByteTables.h"
 #include "s/WideVectors.h"
 
 namespace BitKernels {
@@ -153,9 +154,9 @@ void copyWholeBytes(unsigned char* target, const unsigned char* source, std::siz
 
 // ---- Logic on whole bytes.
 
-enum class Logic { And, Or, Xor, Complement, Reverse };
+enum class Logic { And, Or, Xor, Complement };
 
-/// A value of any width combined; Reverse turns the bits of each byte round.
+/// A value of any width combined.
 template <Logic logic, class Value>
 TESSAL_INLINE_BODY void combineValue(Value& target, const Value& source) {
     if constexpr (logic == Logic::And) {
@@ -164,12 +165,8 @@ TESSAL_INLINE_BODY void combineValue(Value& target, const Value& source) {
         target |= source;
     } else if constexpr (logic == Logic::Xor) {
         target ^= source;
-    } else if constexpr (logic == Logic::Complement) {
-        target = ~source;
     } else {
-        target = (source >> 4 & 0x0F0F0F0F0F0F0F0FU) | (source & 0x0F0F0F0F0F0F0F0FU) << 4;
-        target = (target >> 2 & 0x3333333333333333U) | (target & 0x3333333333333333U) << 2;
-        target = (target >> 1 & 0x5555555555555555U) | (target & 0x5555555555555555U) << 1;
+        target = ~source;
     }
 }
 
@@ -211,27 +208,6 @@ void combine(unsigned char* target, const unsigned char* source, std::size_t cou
         combineBody<logic, NarrowBlock>(target, source, count);
     }
 }
-
-#if TESSAL_HAS_WIDE
-/// Turns the bits of each byte round by looking up its halves; as many whole blocks as there are.
-TESSAL_WIDE std::size_t reverseBlocks(unsigned char* target, const unsigned char* source, std::size_t count) {
-    const __m256i turned = _mm256_broadcastsi128_si256(
-        _mm_setr_epi8(0x0, 0x8, 0x4, 0xC, 0x2, 0xA, 0x6, 0xE, 0x1, 0x9, 0x5, 0xD, 0x3, 0xB, 0x7, 0xF));
-    const __m256i half = _mm256_set1_epi8(0x0F);
-    std::size_t i = 0;
-    for (; i + sizeof(__m256i) <= count; i += sizeof(__m256i)) {
-        const __m256i bytes = _mm256_loadu_si256(reinterpret_cast<const __m256i*>(source + i));
-        const __m256i low = _mm256_shuffle_epi8(turned, _mm256_and_si256(bytes, half));
-        const __m256i high = _mm256_shuffle_epi8(turned, _mm256_and_si256(_mm256_srli_epi16(bytes, 4), half));
-        _mm256_storeu_si256(reinterpret_cast<__m256i*>(target + i), _mm256_or_si256(_mm256_slli_epi16(low, 4), high));
-    }
-    return i;
-}
-#else
-std::size_t reverseBlocks(unsigned char*, const unsigned char*, std::size_t) {
-    return 0;
-}
-#endif
 
 // ---- Searching in whole bytes.
 
@@ -415,18 +391,11 @@ void complementBytes(unsigned char* target, const unsigned char* source, std::si
     combine<Logic::Complement>(target, source, count);
 }
 
-void reverseBytes(unsigned char* target, const unsigned char* source, std::size_t count) {
-    const std::size_t done = hasWideVectors() ? reverseBlocks(target, source, count) : 0;
-    combineBody<Logic::Reverse, NarrowBlock>(target + done, source + done, count - done);
-}
-
 Word reverseBits(Word value, std::size_t count) {
     if (count == 0) {
         return 0;
     }
-    Word reversed = 0;
-    combineValue<Logic::Reverse>(reversed, value);
-    return __builtin_bswap64(reversed) >> (wordBits - count);
+    return __builtin_bswap64(ByteTables::mirrorEachByte(value)) >> (wordBits - count);
 }
 
 }  // namespace BitKernels

@@ -54,8 +54,6 @@ void andBytes(unsigned char* target, const unsigned char* source, std::size_t co
 void orBytes(unsigned char* target, const unsigned char* source, std::size_t count);
 void xorBytes(unsigned char* target, const unsigned char* source, std::size_t count);
 void complementBytes(unsigned char* target, const unsigned char* source, std::size_t count);
-/// Turns each byte's bits round: bit 0 becomes bit 7 and so on.
-void reverseBytes(unsigned char* target, const unsigned char* source, std::size_t count);
 /// Turns the low @p count bits of the value round, at most 64; the others become 0.
 Word reverseBits(Word value, std::size_t count);
 

@@ -60,6 +60,12 @@ constexpr std::array<std::array<char, 8>, 256> makeBitTexts() {
 inline constexpr auto digitValue = makeDigitValues();
 /// The byte with its bits in reverse order.
 inline constexpr auto mirroredByte = makeMirroredBytes();
+/// The word with the bits of each of its bytes in reverse order.
+constexpr std::uint64_t mirrorEachByte(std::uint64_t word) {
+    word = (word >> 1 & 0x5555555555555555U) | (word & 0x5555555555555555U) << 1;
+    word = (word >> 2 & 0x3333333333333333U) | (word & 0x3333333333333333U) << 2;
+    return (word >> 4 & 0x0F0F0F0F0F0F0F0FU) | (word & 0x0F0F0F0F0F0F0F0FU) << 4;
+}
 /// The byte as two hex digits, the high one first.
 inline constexpr auto hexPair = makeHexPairs();
 /// The byte as eight characters 0 and 1, the least significant bit first.

@@ -309,6 +309,6 @@ char* Hex2Bit::swapWord(std::int32_t value) {
     const unsigned int number = filledNumber(value);
     const std::string text = hexOfNumber(number << 16 | number >> 16, 8);
     char* const result = newText(text.size());
-    std::memcpy(result, text.data(), text.size());
+    text.copy(result, text.size());
     return result;
 }

@@ -13,7 +13,8 @@
 #include "HkStream.h"
 #include "RLBitVec.h"
 #include "s/BitKernels.h"
-#include "s/HexDigits.h"
+#include "s/ByteTables.h"
+#include "s/TextKernels.h"
 #include "s/UnitOrigin.h"
 
 namespace {
@@ -55,26 +56,29 @@ void setBytes(unsigned char* target, unsigned char value, std::size_t count) {
     }
 }
 
-/// Turns characters into half bytes, the first of each pair high. A character that is no digit repeats the one before
-/// it; @p last is the digit before the text, and then the last one of it.
-void decodeRepeating(unsigned char* bytes, std::string_view text, unsigned& last) {
-    const auto next = [&last](char character) {
-        const unsigned value = HexDigits::valueOf(character);
-        last = value != HexDigits::noDigit ? value : last;
-        return last;
-    };
-    for (std::size_t done = 0; done < text.size();) {
-        const std::size_t pairs = HexDigits::decodePairs(bytes + done / 2, text.data() + done, text.size() - done);
-        done += pairs;
-        if (pairs != 0) {
-            last = bytes[done / 2 - 1] & 0xFU;
+constexpr std::size_t hexChunk = 4096;
+
+bool isHexDigit(char character) {
+    return ByteTables::valueOf(character) != ByteTables::notADigit;
+}
+
+/// Turns at most a chunk of characters into the bits that appending them gives, four each. A character that is no digit
+/// repeats the one before it; @p last is the digit before the text, and then the last one of it.
+void decodeRepeating(unsigned char* bytes, std::string_view text, char& last) {
+    constexpr ByteOrder asAppended{false, true};
+    const std::size_t pairs = text.size() / 2;
+    std::array<char, hexChunk> repeated;
+    if (!textKernels().decodeHex(text.data(), pairs, asAppended, bytes) || !isHexDigit(text.back())) {
+        for (std::size_t i = 0; i < text.size(); ++i) {
+            last = isHexDigit(text[i]) ? text[i] : last;
+            repeated[i] = last;
         }
-        if (done < text.size()) {
-            const unsigned high = next(text[done]);
-            const unsigned low = done + 1 < text.size() ? next(text[done + 1]) : 0;
-            bytes[done / 2] = static_cast<unsigned char>(high << 4 | low);
-            done += 2;
-        }
+        text = {repeated.data(), text.size()};
+        textKernels().decodeHex(text.data(), pairs, asAppended, bytes);
+    }
+    last = text.back();
+    if (text.size() % 2 != 0) {
+        bytes[pairs] = static_cast<unsigned char>(ByteTables::mirroredByte[ByteTables::valueOf(last)] >> 4);
     }
 }
 
@@ -238,24 +242,20 @@ void LRBitVec::append(const LRBitVec& other) {
 }
 
 void LRBitVec::appendHex(std::string_view hexText) {
-    constexpr std::size_t chunk = 4096;
     const auto* const begin = hexText.data();
-    const auto* const first = std::find_if(begin, begin + hexText.size(), [](char character) {
-        return HexDigits::valueOf(character) != HexDigits::noDigit;
-    });
+    const auto* const first = std::find_if(begin, begin + hexText.size(), isHexDigit);
     hexText.remove_prefix(static_cast<std::size_t>(first - begin));
-    std::array<unsigned char, chunk / 2> bytes;
-    unsigned last = 0;
+    std::array<unsigned char, hexChunk / 2> bytes;
+    char last = '0';
     const bool inBlocks = appendsInBlocks();
     std::unique_ptr<unsigned char[]> former;  // which may hold the text
     if (inBlocks) {
         const std::size_t added = hexText.size() * 4;
         former = replaceArray(capacityAfterAppending(added), m_numberBits, m_numberBits + added);
     }
-    for (; !hexText.empty(); hexText.remove_prefix(std::min(chunk, hexText.size()))) {
-        const std::string_view digits = hexText.substr(0, chunk);
+    for (; !hexText.empty(); hexText.remove_prefix(std::min(hexChunk, hexText.size()))) {
+        const std::string_view digits = hexText.substr(0, hexChunk);
         decodeRepeating(bytes.data(), digits, last);
-        BitKernels::reverseBytes(bytes.data(), bytes.data(), (digits.size() + 1) / 2);
         if (inBlocks) {
             BitKernels::copyBits(m_data, m_numberBits, bytes.data(), 0, 4 * digits.size());
             m_numberBits += 4 * digits.size();

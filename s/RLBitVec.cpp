@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "s/BitKernels.h"
+#include "s/TextKernels.h"
 
 namespace {
 
@@ -152,7 +153,7 @@ void RLBitVec::updateBitField(const char* bytes, int start, int count, bool reve
     std::array<unsigned char, 1024> turned;
     for (std::size_t done = 0; done < size; done += turned.size()) {
         const std::size_t part = std::min(turned.size(), size - done);
-        BitKernels::reverseBytes(turned.data(), asBytes(bytes) + done, part);
+        textKernels().mirrorBytes(asBytes(bytes) + done, part, turned.data());
         writeField(countOf(start) + 8 * done, turned.data(), 8 * part);
     }
 }

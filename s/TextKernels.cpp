@@ -14,17 +14,10 @@ std::uint64_t load64(const void* from) {
     return word;
 }
 
-/// Reverses the bits of the eight bytes of a word.
-std::uint64_t mirrorWord(std::uint64_t word) {
-    word = (word >> 1 & 0x5555555555555555U) | (word & 0x5555555555555555U) << 1;
-    word = (word >> 2 & 0x3333333333333333U) | (word & 0x3333333333333333U) << 2;
-    return (word >> 4 & 0x0F0F0F0F0F0F0F0FU) | (word & 0x0F0F0F0F0F0F0F0FU) << 4;
-}
-
 void mirrorBytes(const unsigned char* from, std::size_t count, unsigned char* to) {
     std::size_t i = 0;
     for (; i + 8 <= count; i += 8) {
-        const std::uint64_t word = mirrorWord(load64(from + i));
+        const std::uint64_t word = ByteTables::mirrorEachByte(load64(from + i));
         std::memcpy(to + i, &word, sizeof word);
     }
     for (; i < count; ++i) {

@@ -6,7 +6,6 @@
 
 #include "Model.h"
 #include "s/BitKernels.h"
-#include "s/HexDigits.h"
 #include "s/WideVectors.h"
 
 namespace {
@@ -96,14 +95,7 @@ TEST_P(Kernels, FillFindCompareCountAndHash) {
 TEST_P(Kernels, WorkOnWholeBytesOfEveryCount) {
     for (std::size_t count = 0; count < 200; ++count) {
         const Model source = array(0, 8 * count);
-        Model reversed = source;
         Model combined = source;
-        Model expected = source;
-        for (std::size_t i = 0; i < 8 * count; ++i) {
-            expected.put(i, source.bit(i ^ 7));
-        }
-        reverseBytes(reversed.bytes.data(), reversed.bytes.data(), count);
-        ASSERT_EQ(reversed.bytes, expected.bytes);
         complementBytes(combined.bytes.data(), source.bytes.data(), count);
         andBytes(combined.bytes.data(), source.bytes.data(), count);
         ASSERT_EQ(combined.bytes, std::vector<unsigned char>(count, 0));
@@ -111,26 +103,6 @@ TEST_P(Kernels, WorkOnWholeBytesOfEveryCount) {
         ASSERT_EQ(combined.bytes, source.bytes);
         xorBytes(combined.bytes.data(), source.bytes.data(), count);
         ASSERT_EQ(combined.bytes, std::vector<unsigned char>(count, 0));
-    }
-}
-
-TEST_P(Kernels, DecodeHexUpToTheFirstForeignCharacter) {
-    const std::string digits = "0123456789abcdefABCDEF";
-    for (int foreign = 1; foreign < 256; ++foreign) {
-        const bool isDigit = digits.find(static_cast<char>(foreign)) != std::string::npos;
-        const std::size_t count = 64 + m_random() % 80;
-        const std::size_t at = m_random() % count;
-        std::string text(count, '0');
-        for (char& digit : text) {
-            digit = digits[m_random() % digits.size()];
-        }
-        text[at] = static_cast<char>(foreign);
-        std::vector<unsigned char> bytes(count / 2);
-        const std::size_t decoded = HexDigits::decodePairs(bytes.data(), text.data(), count);
-        ASSERT_EQ(decoded, (isDigit ? count : at) / 2 * 2) << foreign << " in " << text;
-        for (std::size_t i = 0; i < decoded; i += 2) {
-            ASSERT_EQ(bytes[i / 2], std::stoi(text.substr(i, 2), nullptr, 16));
-        }
     }
 }
 

@@ -141,8 +141,9 @@ TEST_F(Hex2BitLoad, IndexesBeyondTheVectorArePassedOver) {
     Hex2Bit::convertHexString2BitVec(&vector, "fe", 8, false, false, false);
     EXPECT_EQ(bitsOf(vector), "111111");
     Hex2Bit::convertHexString2BitVec(&vector, "fe", 8, true, false, false);
-    EXPECT_EQ(bitsOf(vector), "111111");
+    EXPECT_EQ(bitsOf(vector), "011111") << "the last bit of the text at index 0";
     Hex2Bit::convertHexString2BitVec(&vector, "a000", 0x7FFFFFFF, true, false, false);
+    EXPECT_EQ(bitsOf(vector), "011111") << "all of it beyond";
     RLBitVec other(6);
     Hex2Bit::convertBinString2BitVec(&other, "11000001", 8, true);
     EXPECT_EQ(bitsOf(other), "100000");

@@ -1,10 +1,11 @@
 #!/usr/bin/env bash
 # about: the reference builds without a warning, and links between pages lead somewhere
-# needs: doxygen=doxygen
+# needs: doxygen=doxygen python3=python3
 # limit: 300
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 
+step "pictures" python3 "$root/docs/draw_bits.py" "$root/docs/pictures"
 step "doxygen" bash -c "cd '$root' && doxygen docs/Doxyfile"
 
 broken=0
