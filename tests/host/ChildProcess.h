@@ -8,6 +8,8 @@
 
 class ChildProcess {
 public:
+    /// No process; only to be assigned to.
+    ChildProcess();
     /// Starts this program in @p role with these arguments. Its standard input and output are ours.
     ChildProcess(const std::string& role, const std::vector<std::string>& arguments);
     ~ChildProcess();

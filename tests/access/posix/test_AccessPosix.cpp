@@ -1,4 +1,5 @@
 // What can go wrong with a lock between processes on a POSIX host, one test a fault.
+#include <dlfcn.h>
 #include <gmock/gmock.h>
 #include <grp.h>
 #include <gtest/gtest.h>
@@ -329,4 +330,25 @@ TEST(AccessDamage, OverwrittenCountsAndNamesHurtNobody) {
         isFree(port);
         ::shmdt(segment);
     }
+}
+
+TEST(AccessCopies, TwoCopiesOfTheLibraryInOneProcessExcludeEachOther) {
+    const int port = freshPort();
+    void* const module = ::dlopen(ACCESS_COPY, RTLD_NOW | RTLD_LOCAL);
+    ASSERT_NE(module, nullptr) << ::dlerror();
+    const auto open = reinterpret_cast<void* (*)(int)>(::dlsym(module, "copyOpen"));
+    const auto lock = reinterpret_cast<bool (*)(void*)>(::dlsym(module, "copyLock"));
+    const auto close = reinterpret_cast<void (*)(void*)>(::dlsym(module, "copyClose"));
+    {
+        Access ours(port, Access::SHARE);
+        void* const theirs = open(port);
+        EXPECT_TRUE(lock(theirs));
+        EXPECT_FALSE(ours.lock());
+        EXPECT_EQ(inChild([&] { return lock(theirs) ? 1 : 0; }), 0);
+        close(theirs);
+        EXPECT_TRUE(ours.lock());
+    }
+    EXPECT_TRUE(isNothingLeft(port));
+    ::dlclose(module);
+    EXPECT_EQ(inChild([] { return 0; }), 0);  // the fork handlers of the unloaded copy are gone too
 }

@@ -89,6 +89,7 @@ ChildProcess::ChildProcess(const std::string& role, const std::vector<std::strin
     m_body->start(words);
 }
 
+ChildProcess::ChildProcess() = default;
 ChildProcess::~ChildProcess() = default;
 ChildProcess::ChildProcess(ChildProcess&&) noexcept = default;
 ChildProcess& ChildProcess::operator=(ChildProcess&&) noexcept = default;
