@@ -4,9 +4,9 @@
 
 #include <iostream>
 
+#include "../Port.h"
 #include "Access.h"
 #include "MessageRecorder.h"
-#include "Port.h"
 #include "host/Role.h"
 #include "platform/windows/SemaphoreCalls.h"
 
