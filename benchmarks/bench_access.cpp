@@ -14,7 +14,7 @@
 #include <vector>
 
 #include "Access.h"
-#include "benchmarks/Item.h"
+#include "Item.h"
 
 #if __has_include(<boost/interprocess/sync/named_semaphore.hpp>)
 #include <boost/interprocess/sync/named_semaphore.hpp>
@@ -25,8 +25,10 @@ namespace {
 
 constexpr int port = 987001;
 
+/// A name that the processes of this run share: it is made of the number of the first one.
 std::string ownName(const char* what) {
-    return std::string("tessal_bench_") + what + std::to_string(::getppid());
+    static const pid_t first = ::getpid();
+    return std::string("tessal_bench_") + what + std::to_string(first);
 }
 
 // Each pair is a class with the operation pair(), which is true if it got the lock and gave it back.
@@ -47,9 +49,11 @@ private:
     Access m_access{port, Access::COUNT};
 };
 
+/// With as many units as the Access beside it: among four processes, one unit is refused mostly, five never.
+template <unsigned units>
 class SemaphorePair {
 public:
-    SemaphorePair() : m_name("/" + ownName("sem")), m_semaphore(::sem_open(m_name.c_str(), O_CREAT, 0600, 1)) {}
+    SemaphorePair() : m_name("/" + ownName("sem")), m_semaphore(::sem_open(m_name.c_str(), O_CREAT, 0600, units)) {}
     ~SemaphorePair() {
         ::sem_close(m_semaphore);
         ::sem_unlink(m_name.c_str());
@@ -103,9 +107,10 @@ private:
 #ifdef TESSAL_HAS_BOOST_INTERPROCESS
 namespace bip = boost::interprocess;
 
+template <unsigned units>
 class BoostPair {
 public:
-    BoostPair() : m_name(ownName("boost")), m_semaphore(bip::open_or_create, m_name.c_str(), 1) {}
+    BoostPair() : m_name(ownName("boost")), m_semaphore(bip::open_or_create, m_name.c_str(), units) {}
     ~BoostPair() { bip::named_semaphore::remove(m_name.c_str()); }
     BoostPair(const BoostPair&) = delete;
     BoostPair& operator=(const BoostPair&) = delete;
@@ -151,7 +156,7 @@ void alone(benchmark::State& state) {
 template <class Pair>
 void amongFour(benchmark::State& state) {
     std::vector<pid_t> others;
-    Pair first;  // keeps the lock's object while the others open it
+    Pair first;  // before the others, so that they open what is there
     for (int i = 0; i < 3; ++i) {
         const pid_t child = ::fork();
         if (child == 0) {
@@ -243,37 +248,54 @@ bool idsAgree() {
 }
 [[maybe_unused]] const bool agreed = idsAgree();
 
-template <void (*body)(benchmark::State&)>
-std::vector<Side> withBoost(BenchmarkBody boost) {
-    std::vector<Side> sides;
-    if (boost != nullptr) {
-        sides.push_back({"boost named_semaphore", boost});
-    }
-    return sides;
+#ifdef TESSAL_HAS_BOOST_INTERPROCESS
+template <unsigned units>
+std::vector<Side> boostAlone() {
+    return {{"boost named_semaphore", alone<BoostPair<units>>}};
 }
 
-#ifdef TESSAL_HAS_BOOST_INTERPROCESS
-const std::vector<Side> boostAlone = {{"boost named_semaphore", alone<BoostPair>}};
-const std::vector<Side> boostAmongFour = {{"boost named_semaphore", amongFour<BoostPair>}};
+template <unsigned units>
+std::vector<Side> boostAmongFour() {
+    return {{"boost named_semaphore", amongFour<BoostPair<units>>}};
+}
 #else
-const std::vector<Side> boostAlone = {};
-const std::vector<Side> boostAmongFour = {};
+template <unsigned>
+std::vector<Side> boostAlone() {
+    return {};
+}
+
+template <unsigned>
+std::vector<Side> boostAmongFour() {
+    return {};
+}
 #endif
 
-const Side semaphoreAlone{"sem_trywait, sem_post", alone<SemaphorePair>};
-const Side semaphoreAmongFour{"sem_trywait, sem_post", amongFour<SemaphorePair>};
+template <unsigned units>
+constexpr Side semaphoreAlone{"sem_trywait, sem_post", alone<SemaphorePair<units>>};
+template <unsigned units>
+constexpr Side semaphoreAmongFour{"sem_trywait, sem_post", amongFour<SemaphorePair<units>>};
 
 const RegisterItem items[] = {
-    RegisterItem{{"lock_unlock", {"Access", alone<AccessPair>}, boostAlone, semaphoreAlone, 1.20, 1.20}},
-    RegisterItem{{"count_take_give", {"Access", alone<CountPair>}, boostAlone, semaphoreAlone, 1.40, 1.40}},
+    RegisterItem{{"lock_unlock", {"Access", alone<AccessPair>}, boostAlone<1>(), semaphoreAlone<1>, 1.20, 1.20}},
+    RegisterItem{{"count_take_give", {"Access", alone<CountPair>}, boostAlone<5>(), semaphoreAlone<5>, 1.40, 1.40}},
     RegisterItem{{"lock_unlock_flock", {"Access", alone<AccessPair>}, {{"flock", alone<FlockPair>}}, {}, 1.0, 0}},
     RegisterItem{{"lock_unlock_record", {"Access", alone<AccessPair>}, {{"fcntl", alone<RecordLockPair>}}, {}, 1.0, 0}},
-    RegisterItem{{"lock_unlock_4", {"Access", amongFour<AccessPair>}, boostAmongFour, semaphoreAmongFour, 0, 0}},
-    RegisterItem{{"count_take_give_4", {"Access", amongFour<CountPair>}, boostAmongFour, semaphoreAmongFour, 0, 0}},
-    RegisterItem{{"lock_unlock_4_flock", {"Access", amongFour<AccessPair>}, {{"flock", amongFour<FlockPair>}}, {}, 0, 0}},
-    RegisterItem{{"lock_unlock_4_record", {"Access", amongFour<AccessPair>}, {{"fcntl", amongFour<RecordLockPair>}}, {}, 0, 0}},
-    RegisterItem{{"lock_open_close", {"Access", openAccess}, boostOpen, {"sem_open, sem_unlink", openSemaphore}, 1.50, 1.50}},
-    RegisterItem{{"port_id", {"Access", idOurs}, {{"formatted line", formattedLine}}, {"compare ladder", idByLadder}, 0.20, 2.00}},
+    RegisterItem{
+        {"lock_unlock_4", {"Access", amongFour<AccessPair>}, boostAmongFour<1>(), semaphoreAmongFour<1>, 0, 0}},
+    RegisterItem{
+        {"count_take_give_4", {"Access", amongFour<CountPair>}, boostAmongFour<5>(), semaphoreAmongFour<5>, 0, 0}},
+    RegisterItem{
+        {"lock_unlock_4_flock", {"Access", amongFour<AccessPair>}, {{"flock", amongFour<FlockPair>}}, {}, 0, 0}},
+    RegisterItem{
+        {"lock_unlock_4_record", {"Access", amongFour<AccessPair>}, {{"fcntl", amongFour<RecordLockPair>}}, {}, 0, 0}},
+    RegisterItem{
+        {"lock_open_close", {"Access", openAccess}, boostOpen, {"sem_open, sem_unlink", openSemaphore}, 1.50, 1.50}},
+    RegisterItem{{"port_id",
+                  {"Access", idOurs},
+                  {{"formatted line", formattedLine}},
+                  {"compare ladder", idByLadder},
+                  0.20,
+                  2.00}},
 };
 
 }  // namespace

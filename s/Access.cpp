@@ -6,7 +6,6 @@
 #include <utility>
 
 #include "HkMessageManager.h"
-#include "HkStr.h"
 #include "UnitOrigin.h"
 #include "platform/NamedSemaphore.h"
 
@@ -34,9 +33,20 @@ constexpr Family families[] = {{"LPT", 20}, {"USB", 40}, {"USB2", 60}, {"COM", 8
 constexpr int shareBase = 100;
 constexpr int countBase = 1000;
 
+/// True if @p text is @p name, which is in upper case, in any case of its letters.
+bool isName(const char* text, const char* name) {
+    for (; *name != '\0'; ++text, ++name) {
+        const bool isLowerCase = *name >= 'A' && *text == *name - 'A' + 'a';
+        if (*text != *name && !isLowerCase) {
+            return false;
+        }
+    }
+    return *text == '\0';
+}
+
 const Family* findFamily(const char* name) {
     for (const Family& family : families) {
-        if (HkStr::ICompare(name, family.name) == 0) {
+        if (isName(name, family.name)) {
             return &family;
         }
     }
