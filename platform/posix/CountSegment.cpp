@@ -61,7 +61,7 @@ Attachment::Outcome Attachment::attachAgain(const Attachment& other) {
 Attachment::Outcome Attachment::attach(int identifier) {
     const ForkMark::ForkPause pause;
     void* const address = SystemV::attach(identifier);
-    if (address == reinterpret_cast<void*>(-1)) {
+    if (address == nullptr) {
         return failure();
     }
     m_segment = static_cast<CountSegment*>(address);

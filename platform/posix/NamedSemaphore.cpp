@@ -1,5 +1,7 @@
 #include "platform/NamedSemaphore.h"
 
+#include <algorithm>
+#include <chrono>
 #include <cstring>
 #include <memory>
 #include <utility>
@@ -75,6 +77,11 @@ bool isNamed(const CountSegment& segment, const char* name) {
 
 bool isOursOrNew(const CountSegment& segment) {
     return segment.sign == CountSegment::ourSign || segment.sign == 0;
+}
+
+/// The count as callers expect it; only a stranger's writing makes it negative.
+std::int32_t readable(std::int32_t units) {
+    return std::max(units, std::int32_t{0});
 }
 
 /// What the keys of a name hold.
@@ -233,7 +240,7 @@ bool release(PlatformSemaphore* handle, std::int32_t units, std::int32_t* previo
     } while (
         !segment.count.compare_exchange_weak(seen, seen + units, std::memory_order_release, std::memory_order_relaxed));
     if (previous != nullptr) {
-        *previous = seen;
+        *previous = readable(seen);
     }
     return true;
 }
@@ -243,7 +250,7 @@ bool count(PlatformSemaphore* handle, std::int32_t& value) {
         failureCode = invalidHandle;
         return false;
     }
-    value = handle->attachment.segment()->count.load(std::memory_order_relaxed);
+    value = readable(handle->attachment.segment()->count.load(std::memory_order_relaxed));
     return true;
 }
 

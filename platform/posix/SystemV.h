@@ -31,8 +31,10 @@ inline int getSegment(key_t key, std::size_t size, int flags) {
     return allows("shmget") ? ::shmget(key, size, flags) : -1;
 }
 
+/// Null on failure.
 inline void* attach(int segment) {
-    return allows("shmat") ? ::shmat(segment, nullptr, 0) : reinterpret_cast<void*>(-1);
+    void* const address = allows("shmat") ? ::shmat(segment, nullptr, 0) : MAP_FAILED;
+    return address == MAP_FAILED ? nullptr : address;  // both calls fail with the same value
 }
 
 inline int detach(const void* address) {

@@ -326,6 +326,7 @@ TEST(AccessDamage, OverwrittenCountsAndNamesHurtNobody) {
         access.lock();
         access.unlock();
         access.cleanLock();
+        access.incCount();
         access.getNormalizedCount();
         isFree(port);
         ::shmdt(segment);
