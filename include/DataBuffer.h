@@ -2,6 +2,8 @@
 /// A growing byte buffer in which a message is put together or taken apart.
 #pragma once
 
+#include <cstddef>
+
 #include "TessalExport.h"
 #include "WireForm.h"
 
@@ -41,7 +43,7 @@ public:
             m_data[m_position++] = value;
         }
     }
-    /// Writes @p length bytes; nothing for null or a length below 1.
+    /// Writes @p length bytes, which may be the buffer's own; nothing for null or a length below 1.
     void write(const char* data, int length);
     /// Null is written as the empty text. A text whose bytes find no space leaves the length alone written.
     void writeString(const char* text);
@@ -66,6 +68,7 @@ private:
         return holds(size);
     }
     void checkBufferSpace(int requested);
+    std::ptrdiff_t placeInside(const char* data) const;
 
     int m_position = 0;
     int m_capacity = 0;

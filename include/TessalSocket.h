@@ -42,12 +42,14 @@ public:
     /// As deinitialize().
     ~TessalSocket();
 
-    /// Starts the host's socket library, then listens, or tries once to connect, which fails without a message.
+    /// Starts the host's socket library where the object has not yet, then listens, or tries once to connect, which
+    /// fails without a message.
     bool initialize();
-    /// Closes the role's own socket and stops what initialize() started; true. A server's client socket is the
+    /// Closes the role's own socket and stops what was started; true. A server's client socket is the
     /// caller's to close.
     bool deinitialize();
-    /// Closes a client's socket, waits 50 milliseconds and tries ten times to connect.
+    /// Closes a client's socket, waits 50 milliseconds and tries ten times to connect. Starts the socket library too,
+    /// where initialize() has not.
     bool connectToServer();
     /// Waits for a client; noSocket where that fails. The two are the host's address and its length, or null.
     Socket acceptClient(sockaddr* address, int* addressLength);
@@ -90,6 +92,7 @@ private:
 
     char* strError(int code);
     int getLastError();
+    bool startLibrary();
     bool initializeSocketInServer();
     bool initializeSocketInClient();
     bool deinitializeSocketInServer();

@@ -1,7 +1,9 @@
 #include "DataBuffer.h"
 
 #include <cstring>
+#include <functional>
 #include <limits>
+#include <string>
 #include <utility>
 
 #include "HkMemory.h"
@@ -41,8 +43,12 @@ DataBuffer::~DataBuffer() {
 }
 
 void DataBuffer::write(const char* data, int length) {
-    if (data != nullptr && length > 0 && hasSpace(length)) {
-        std::memcpy(m_data + m_position, data, static_cast<std::size_t>(length));
+    if (data == nullptr || length < 1) {
+        return;
+    }
+    const std::ptrdiff_t own = placeInside(data);
+    if (hasSpace(length)) {
+        std::memmove(m_data + m_position, own < 0 ? data : m_data + own, static_cast<std::size_t>(length));
         m_position += length;
     }
 }
@@ -54,8 +60,21 @@ void DataBuffer::writeString(const char* text) {
         HkMessageManager::debugStub("Error reallocating space in DataBuffer.\n");
         return;
     }
+    if (placeInside(text) >= 0) {
+        const std::string copy(text, length);  // the length may be written over the text
+        writeInt(static_cast<int>(length));
+        write(copy.data(), static_cast<int>(length));
+        return;
+    }
     writeInt(static_cast<int>(length));
     write(text, static_cast<int>(length));
+}
+
+/// Where in the buffer @p data points, for it moves when the buffer grows; -1 for anywhere else.
+std::ptrdiff_t DataBuffer::placeInside(const char* data) const {
+    const std::less<> before;
+    const bool inside = m_data != nullptr && !before(data, m_data) && before(data, m_data + m_capacity);
+    return inside ? data - m_data : -1;
 }
 
 void DataBuffer::checkBufferSpace(int requested) {

@@ -49,12 +49,19 @@ TessalSocket::~TessalSocket() {
 }
 
 bool TessalSocket::initialize() {
+    if (!startLibrary()) {
+        return false;
+    }
+    return isClient() ? initializeSocketInClient() : initializeSocketInServer();
+}
+
+bool TessalSocket::startLibrary() {
     if (!m_started && !platform::socketHost().start()) {
         origin.report().issueStatus("Failed to load Winsock!\n");
         return false;
     }
     m_started = true;
-    return isClient() ? initializeSocketInClient() : initializeSocketInServer();
+    return true;
 }
 
 bool TessalSocket::deinitialize() {
@@ -126,6 +133,9 @@ bool TessalSocket::closeField(Socket& field) {
 }
 
 bool TessalSocket::connectToServer() {
+    if (!startLibrary()) {
+        return false;
+    }
     closeField(m_clientFd);
     platform::socketHost().pause(pauseBeforeAttempts);
     for (int left = attempts; left > 0; --left) {

@@ -3,6 +3,7 @@
 #include <cstdio>
 #include <cstring>
 
+#include "DeviceCommands.h"
 #include "Help.h"
 #include "OptionCommands.h"
 #include "Session.h"
@@ -35,9 +36,9 @@ struct Row {
 };
 
 constexpr Row rows[] = {
-    {"custcode", showOptions},  {"erase", showOptions},   {"help", help},
-    {"preference", preference}, {"program", showOptions}, {"quit", quit},
-    {"readback", showOptions},  {"verify", showOptions},
+    {"closecable", closeCable}, {"custcode", showOptions},  {"erase", showOptions},   {"help", help},
+    {"identify", identify},     {"preference", preference}, {"program", showOptions}, {"quit", quit},
+    {"readback", showOptions},  {"setcable", setCable},     {"verify", showOptions},
 };
 
 }  // namespace

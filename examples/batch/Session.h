@@ -31,6 +31,12 @@ public:
 
     /// Reports a word that is no command, with the nearest one that is.
     void sayUnknown(const char* word) const;
+    /// Reports something about the current line.
+    void say(const std::string& text) const { m_messages.say(text); }
+
+    /// Where the device serves that the cable leads to; empty for none.
+    const std::string& device() const { return m_device; }
+    void setDevice(const std::string& address) { m_device = address; }
 
 private:
     Outcome takeText(const std::string& text);
@@ -41,5 +47,6 @@ private:
     bool m_isPrompt;
     bool m_hasEnded = false;
     int m_number = 0;
+    std::string m_device;
     std::array<int, 4> m_counts{};
 };

@@ -50,7 +50,12 @@ public:
         return keptToThisProcess(::accept(socket, address, addressLength));
     }
 
+    // The host takes an empty name for itself, or for any address.
     bool resolve(const char* name, std::uint16_t port, SocketAddress& address) override {
+        if (name[0] == '\0') {
+            WSASetLastError(WSAHOST_NOT_FOUND);
+            return false;
+        }
         address = {AF_INET, htons(port), ::inet_addr(name), {}};
         if (address.address != INADDR_NONE) {
             return true;

@@ -98,4 +98,15 @@ TEST(DataBuffer, CopiesAreIndependent) {
     }
 }
 
+TEST(DataBuffer, ItsOwnBytesCanBeWrittenAgain) {
+    DataBuffer buffer(3);
+    buffer.write("ab\0", 3);
+    buffer.write(buffer.getBuffer(), 3);
+    EXPECT_EQ(bytes(buffer), std::string("ab\0ab\0", 6));
+    DataBuffer text(3);
+    text.write("ab\0", 3);
+    text.writeString(text.getBuffer());
+    EXPECT_EQ(bytes(text), std::string("ab\0\2\0\0\0ab", 9));
+}
+
 }  // namespace

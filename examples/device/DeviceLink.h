@@ -1,0 +1,36 @@
+// The way to a simulated device: its address, and messages over a pipe or TCP.
+#pragma once
+
+#include <TessalUtility.h>
+
+#include <optional>
+#include <string>
+
+#include "DeviceMessages.h"
+
+/// Where a device serves: "pipe:NAME", or "tcp:PORT" on this machine.
+struct DeviceAddress {
+    /// Nothing where the text is neither form. Port 0 stands for any free one, and is for a server.
+    static std::optional<DeviceAddress> read(const std::string& text);
+    std::string text() const;
+
+    std::string pipe;  ///< in the library's form; empty for TCP
+    int port = 0;
+};
+
+/// Messages over one connection. A message is a string of the wire form that holds the record's text.
+class DeviceLink {
+public:
+    explicit DeviceLink(TessalSocket& socket) : m_mux(false) { m_mux.setSocketHandle(&socket); }
+    explicit DeviceLink(TessalPipe& pipe) : m_mux(true) { m_mux.setPipeHandle(&pipe); }
+
+    bool send(NetMessage& message);
+    /// False where the peer is gone, announces more than 64 KiB, or sends another record.
+    bool receive(NetMessage& message);
+
+private:
+    TessalPortMux m_mux;
+};
+
+/// Connects, asks and takes the answer, on a connection of its own; false, with messages, where that fails.
+bool askDevice(const DeviceAddress& address, DeviceRequest::Kind kind, ChainAnswer& answer);

@@ -1,0 +1,41 @@
+#include "DeviceMessages.h"
+
+#include <istream>
+#include <ostream>
+
+namespace {
+
+constexpr int longestChain = 64;
+
+}  // namespace
+
+void ChainAnswer::readStream(std::istream& in) {
+    NetMessage::readStream(in);
+    int count = 0;
+    in >> count;
+    if (count < 0 || count > longestChain) {
+        in.setstate(std::ios::failbit);
+    }
+    devices.clear();
+    while (in && static_cast<int>(devices.size()) < count) {
+        NetString name;
+        ChainDevice device;
+        name.readStream(in);
+        in >> device.idCode;
+        if (in) {
+            device.name = name.getString();
+            devices.push_back(device);
+        }
+    }
+}
+
+void ChainAnswer::writeStream(std::ostream& out) {
+    NetMessage::writeStream(out);
+    out << devices.size() << '\n';
+    for (const ChainDevice& device : devices) {
+        NetString name;
+        name.setString(device.name.c_str());
+        name.writeStream(out);
+        out << device.idCode << '\n';
+    }
+}
