@@ -1,0 +1,31 @@
+// The port of a cable, kept from other processes while this one uses it.
+#pragma once
+
+#include <TessalUtility.h>
+
+#include <memory>
+#include <string>
+
+/// Takes a port by its two machine-wide semaphores: one that a single process holds, and one that counts who is
+/// attached. Destroying it gives both back.
+class PortLock {
+public:
+    PortLock() = default;
+    PortLock(const PortLock&) = delete;
+    PortLock& operator=(const PortLock&) = delete;
+    ~PortLock() { giveBack(); }
+
+    /// Takes the port that the display name tells, such as "usb2" or "LPT1", in place of the former one. False where
+    /// it is no port, where all places at it are taken, or where another process holds it; failure() then says which.
+    bool take(const char* displayName);
+    void giveBack();
+
+    const std::string& failure() const { return m_failure; }
+
+private:
+    bool attach(const char* genericName, int number);
+
+    std::unique_ptr<Access> m_holder;
+    std::unique_ptr<Access> m_counter;
+    std::string m_failure;
+};
