@@ -15,6 +15,12 @@ std::string chosenDevice(const Session& session) {
     return !session.device().empty() || given == nullptr ? session.device() : given;
 }
 
+std::string chosenPort(const char* given) {
+    return HkStr::ICompare(given, "auto") != 0
+               ? given
+               : TessalPreference::getPreferenceObject()->getPreference(TessalPreference::DEFAULT_CABLE);
+}
+
 void list(const ChainAnswer& answer) {
     int position = 0;
     for (const ChainDevice& device : answer.devices) {
@@ -26,13 +32,27 @@ void list(const ChainAnswer& answer) {
 }  // namespace
 
 bool setCable(Session& session, const HkCmdArgs& args) {
-    const std::string port = args.text("-port", 0, "");
-    session.setDevice(DeviceAddress::read(port) ? port : "");
+    const std::string port = chosenPort(args.text("-port", 0, ""));
+    const bool isDevice = DeviceAddress::read(port).has_value();
+    session.setDevice(isDevice ? port : "");
+    session.port().giveBack();
+    if (isDevice || port.empty()) {
+        return true;
+    }
+    if (!session.port().take(port.c_str())) {
+        session.say(quotedWhereNeeded(port) + ": " + session.port().failure());
+        return false;
+    }
+    std::puts("  port taken");
     return true;
 }
 
 bool closeCable(Session& session, const HkCmdArgs&) {
     session.setDevice("");
+    if (session.port().isTaken()) {
+        session.port().giveBack();
+        std::puts("  port given back");
+    }
     return true;
 }
 

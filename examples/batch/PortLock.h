@@ -19,6 +19,7 @@ public:
     /// it is no port, where all places at it are taken, or where another process holds it; failure() then says which.
     bool take(const char* displayName);
     void giveBack();
+    bool isTaken() const { return m_holder != nullptr; }
 
     const std::string& failure() const { return m_failure; }
 

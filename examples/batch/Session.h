@@ -7,6 +7,7 @@
 #include <string>
 
 #include "Messages.h"
+#include "PortLock.h"
 
 /// Takes batch lines one by one: each is split into tokens, looked up, checked against its format, shown with its
 /// values, and carried out where there is a handler for it.
@@ -38,6 +39,9 @@ public:
     const std::string& device() const { return m_device; }
     void setDevice(const std::string& address) { m_device = address; }
 
+    /// The port of the cable.
+    PortLock& port() { return m_port; }
+
 private:
     Outcome takeText(const std::string& text);
     bool runCommand(CommandSet& commands);
@@ -48,5 +52,6 @@ private:
     bool m_hasEnded = false;
     int m_number = 0;
     std::string m_device;
+    PortLock m_port;
     std::array<int, 4> m_counts{};
 };
