@@ -9,6 +9,7 @@ install(TARGETS TessalUtility EXPORT TessalUtilityTargets
 install(FILES ${TESSAL_HEADERS} DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/TessalUtility COMPONENT development)
 install(DIRECTORY data/ DESTINATION ${CMAKE_INSTALL_DATADIR}/TessalUtility COMPONENT library
         FILES_MATCHING PATTERN "*.acd" PATTERN "*.dat")
+install(DIRECTORY debug/ DESTINATION ${CMAKE_INSTALL_DATADIR}/TessalUtility/debug COMPONENT development)
 
 set(TESSAL_CMAKE_DIR ${CMAKE_INSTALL_LIBDIR}/cmake/TessalUtility)
 install(EXPORT TessalUtilityTargets NAMESPACE TessalUtility:: DESTINATION ${TESSAL_CMAKE_DIR} COMPONENT development)

@@ -1,9 +1,10 @@
-// The tables of docs/bits.md say what the library does.
+// The tables and pictures of docs/bits.md say what the library does.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <fstream>
+#include <iterator>
 #include <memory>
 #include <sstream>
 #include <string>
@@ -75,6 +76,71 @@ TEST(BitsGuide, TextsBecomeWhatTheTableSays) {
             Hex2Bit::convertBinData2HexString(bytes.get(), std::stoi(row[1]), row[2] == "true", row[3] == "true"));
         EXPECT_EQ(text.get(), row[4]) << testing::PrintToString(row);
     }
+}
+
+struct Forward : RLBitVec {
+    explicit Forward(std::size_t length) : RLBitVec(length) { m_forwardIndex = 1; }
+};
+struct ByteMirror : RLBitVec {
+    explicit ByteMirror(std::size_t length) : RLBitVec(length) { m_byteMirrorIndex = 1; }
+};
+
+/// One thing of each index, with blanks between.
+template <class Thing>
+std::string ofEachIndex(std::size_t length, Thing thing) {
+    std::string text;
+    for (std::size_t i = 0; i < length; ++i) {
+        text += (i > 0 ? " " : "") + std::to_string(thing(i));
+    }
+    return text;
+}
+
+/// The storage position of each index of a vector, found by setting the bit.
+template <class Vector>
+std::string positionsOf(std::size_t length) {
+    return ofEachIndex(length, [=](std::size_t i) {
+        Vector vector(length);
+        vector.setBit(i);
+        return LRBitVec(vector.data(), (length + 7) / 8 * 8).firstTrue();
+    });
+}
+
+/// The place in the text of the digit that index @p i of a load comes from: the one whose ones arrive there.
+std::size_t sourceOf(std::size_t i, std::size_t digits, bool descending, bool byteSwap) {
+    for (std::size_t place = 0; place < digits; ++place) {
+        std::string text(digits, '0');
+        text[place] = 'f';
+        const auto vector =
+            Hex2Bit::convertHexString2BitVec(text.c_str(), static_cast<int>(4 * digits), descending, byteSwap, false);
+        if (vector->testBit(i)) {
+            return place;
+        }
+    }
+    return digits;
+}
+
+TEST(BitsGuide, PicturesShowWhatTheLibraryDoes) {
+    std::ostringstream table;
+    table << "what,of,values\n"
+          << "index,LRBitVec," << positionsOf<LRBitVec>(12) << "\nindex,RLBitVec," << positionsOf<RLBitVec>(12)
+          << "\nindex,RLBitVec forward," << positionsOf<Forward>(12) << "\nindex,RLBitVec byte mirror,"
+          << positionsOf<ByteMirror>(12) << "\n";
+    const std::string positions = positionsOf<RLBitVec>(16);
+    for (const bool descending : {false, true}) {
+        for (const bool byteSwap : {false, true}) {
+            std::ostringstream load;
+            load << std::boolalpha << ",12a5 descending " << descending << " byteSwap " << byteSwap << ",";
+            const auto vector = Hex2Bit::convertHexString2BitVec("12a5", 16, descending, byteSwap, false);
+            const auto bit = [&](std::size_t i) { return vector->testBit(i) ? 1 : 0; };
+            const auto source = [&](std::size_t i) { return sourceOf(i, 4, descending, byteSwap); };
+            table << "bit" << load.str() << ofEachIndex(16, bit) << "\ncharacter" << load.str()
+                  << ofEachIndex(16, source) << "\nposition" << load.str() << positions << "\ndata" << load.str()
+                  << bytesOf(*vector) << "\n";
+        }
+    }
+    std::ifstream file(TEST_DATA_DIR "/../../docs/pictures/bits.csv");
+    const std::string drawn((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
+    EXPECT_EQ(drawn, table.str());
 }
 
 }  // namespace

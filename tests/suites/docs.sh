@@ -1,11 +1,19 @@
 #!/usr/bin/env bash
-# about: the reference builds without a warning, and links between pages lead somewhere
+# about: the pictures are up to date, the reference builds without a warning, links between pages lead somewhere
 # needs: doxygen=doxygen python3=python3
 # limit: 300
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 
-step "pictures" python3 "$root/docs/draw_bits.py" "$root/docs/pictures"
+draw_pictures() {
+    python3 "$root/docs/pictures/bits.py" "$root/build/docs/pictures"
+    local picture
+    for picture in "$root"/build/docs/pictures/*.svg; do
+        diff -q "$picture" "$root/docs/pictures/" || return
+    done
+}
+
+step "pictures" draw_pictures
 step "doxygen" bash -c "cd '$root' && doxygen docs/Doxyfile"
 
 broken=0
