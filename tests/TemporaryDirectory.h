@@ -26,8 +26,16 @@ public:
     /// The path of an entry; the name may hold separators.
     std::string operator/(const std::string& name) const { return m_path + "/" + name; }
 
-    /// Writes a file and gives its path.
+    /// Makes a directory with those above it and gives its path.
+    std::string make(const std::string& name) const {
+        HkFile::mkdir((*this / name).c_str(), true);
+        return *this / name;
+    }
+    /// Writes a file, with the directories above it, and gives its path.
     std::string write(const std::string& name, const std::string& content) const {
+        if (const std::size_t end = name.rfind('/'); end != std::string::npos) {
+            make(name.substr(0, end));
+        }
         std::ofstream(*this / name, std::ios::binary) << content;
         return *this / name;
     }

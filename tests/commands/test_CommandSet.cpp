@@ -3,8 +3,11 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cstring>
 #include <memory>
+#include <sstream>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "MessageRecorder.h"
@@ -29,49 +32,39 @@ Words split(const char* line) {
     return commands != nullptr ? wordsOf(*commands) : Words();
 }
 
-CommandSet setOf(const Words& words) {
-    CommandSet commands;
+std::string joined(const Words& words) {
+    std::string line;
     for (const std::string& word : words) {
+        line += (line.empty() ? "" : "|") + word;
+    }
+    return line;
+}
+
+CommandSet setOf(const std::string& line) {
+    CommandSet commands;
+    std::istringstream words(line + "|");
+    for (std::string word; std::getline(words, word, '|');) {
         commands.addCommand(word.c_str());
     }
     return commands;
 }
 
-struct TokeniserCase {
-    const char* name;
-    const char* line;
-    Words words;
-};
-
-const TokeniserCase tokeniserCases[] = {
-    {"null", nullptr, {}},
-    {"empty", "", {}},
-    {"comment", "# cmd", {}},
-    {"comment sign elsewhere", "a #b", {"a", "#b"}},
-    {"comment sign behind a blank", " # b", {"#", "b"}},
-    {"blanks only", " \t\r\n ", {}},
-    {"leading separators", "\t  cmd", {"cmd"}},
-    {"every separator, at the end too", "cmd  -p\t1\r\n", {"cmd", "-p", "1"}},
-    {"other control characters are letters", "a\vb\fc\x01", {"a\vb\fc\x01"}},
-    {"high bytes are letters", "\xC3\xA4 \xFF\xA0", {"\xC3\xA4", "\xFF\xA0"}},
-    {"quoted words", "cmd \"two words\" x", {"cmd", "two words", "x"}},
-    {"quoted blank", "cmd \" \"", {"cmd", " "}},
-    {"quoted first", "\"a b\" c", {"a b", "c"}},
-    {"letters before a quote are dropped, behind it they are a token", "a\"b c\"d", {"b c", "d"}},
-    {"quotation next to quotation", "\"a\"\"b\"", {"a", "b"}},
-    {"backslash is a letter", "a\\ \"b\\\"", {"a\\", "b\\"}},
-    {"empty quotes behind a separator", "cmd \"\" x", {"cmd", "x"}},
-    {"empty quotes behind a quotation", "cmd \"a\"\"\" x", {"cmd", "a", "x"}},
-    {"empty quotes behind dropped letters", "cmd -u\"\" x", {"cmd", "", "x"}},
-    {"empty quotes first", "\"\" cmd", {"cmd"}},
-    {"no empty command word", "a\"\" cmd", {"cmd"}},
-    {"empty quotes alone", "\"\"", {}},
+// Comments and separators; quotations, before which letters are dropped and behind which they are a token of their own;
+// empty quotations, which are a token behind dropped letters only, and never the command word.
+const std::pair<const char*, const char*> tokeniserCases[] = {
+    {"", ""},         {"a\"\" cmd", "cmd"},         {"a\vb\fc\x01", "a\vb\fc\x01"},
+    {"\"\"", ""},     {"\"a\"\"b\"", "a|b"},        {"\"a b\" \" \" x", "a b| |x"},
+    {"# cmd", ""},    {"x a\"b c\"d", "x|b c|d"},   {"cmd \"a\"\"\" x", "cmd|a|x"},
+    {" # b", "#|b"},  {"a\\ \"b\\\"", "a\\|b\\"},   {"\t  cmd  -p\t1\r\n", "cmd|-p|1"},
+    {" \t\r\n ", ""}, {"cmd -u\"\" x", "cmd||x"},   {"\xC3\xA4 \xFF", "\xC3\xA4|\xFF"},
+    {"a #b", "a|#b"}, {"\"\" cmd \"\" x", "cmd|x"},
 };
 
 TEST(CommandSet, SplitsALine) {
-    for (const TokeniserCase& c : tokeniserCases) {
-        EXPECT_EQ(split(c.line), c.words) << c.name;
-        EXPECT_EQ(splitByModel(c.line != nullptr ? c.line : ""), c.words) << "model: " << c.name;
+    EXPECT_EQ(split(nullptr), Words());
+    for (const auto& [line, words] : tokeniserCases) {
+        EXPECT_EQ(joined(split(line)), words) << line;
+        EXPECT_EQ(split(line), splitByModel(line)) << line;
     }
 }
 
@@ -120,106 +113,87 @@ TEST(CommandSet, TakesLongLinesAndManyTokens) {
     EXPECT_EQ(words[149998], "99999");
 }
 
+/// The fields, which callers read in place.
+struct Layout {
+    explicit Layout(const CommandSet& commands) {
+        static_assert(sizeof(Layout) == sizeof(CommandSet));
+        std::memcpy(static_cast<void*>(this), static_cast<const void*>(&commands), sizeof *this);
+    }
+    int count = 0;
+    int capacity = 0;
+    char** tokens = nullptr;
+};
+
 TEST(CommandSet, GrowsByDoublingAndKeepsItsTokens) {
+    EXPECT_EQ(Layout(CommandSet()).capacity, 8);
     CommandSet commands(1);
     commands.addCommand("first");
     const char* const first = commands.getCommand(0);
     for (int value = -4; value < 12; ++value) {
         commands.addCommand(value);
     }
-    EXPECT_EQ(commands.getNumberCommands(), 17);
-    EXPECT_EQ(commands.getCommand(0), first);
-    EXPECT_EQ(commands.getCommands()[0], first);
+    const Layout layout(commands);
+    EXPECT_TRUE(layout.count == 17 && layout.capacity == 32 && layout.tokens == commands.getCommands());
+    EXPECT_TRUE(commands.getNumberCommands() == 17 && commands.getCommand(17) == nullptr);
+    EXPECT_TRUE(commands.getCommand(0) == first && commands.getCommands()[0] == first);
     EXPECT_STREQ(commands.getCommand(1), "-4");
-    EXPECT_EQ(commands.getCommand(17), nullptr);
     commands.addCommand(static_cast<const char*>(nullptr));
     EXPECT_STREQ(commands.getCommand(17), "");
 }
 
-TEST(CommandSet, HasTheLayoutThatItsCallersRead) {
-    struct Layout {
-        int count;
-        int capacity;
-        char** tokens;
-    };
-    static_assert(sizeof(Layout) == sizeof(CommandSet));
-    CommandSet commands;
-    for (int i = 0; i < 9; ++i) {
-        commands.addCommand(i);
-    }
-    Layout layout{};
-    std::memcpy(&layout, static_cast<const void*>(&commands), sizeof layout);
-    EXPECT_EQ(layout.count, 9);
-    EXPECT_EQ(layout.capacity, 16);
-    EXPECT_EQ(layout.tokens, commands.getCommands());
-}
-
 TEST(CommandSet, CopiesAreIndependent) {
-    CommandSet source = setOf({"a", "b"});
+    CommandSet source = setOf("a|b");
     CommandSet copy(source);
     copy.resetCommand(0, "other");
-    CommandSet assigned = setOf({"x"});
+    CommandSet assigned = setOf("x");
     assigned = source;
     assigned = *&assigned;
     assigned.addCommand("c");
-    EXPECT_THAT(wordsOf(source), ElementsAre("a", "b"));
-    EXPECT_THAT(wordsOf(copy), ElementsAre("other", "b"));
-    EXPECT_THAT(wordsOf(assigned), ElementsAre("a", "b", "c"));
-}
-
-TEST(CommandSet, ResetReplacesATokenOrSaysThatThereIsNone) {
-    CommandSet commands = setOf({"a", "b"});
-    commands.resetCommand(1, commands.getCommand(1));
-    EXPECT_THAT(wordsOf(commands), ElementsAre("a", "b"));
-    EXPECT_THROW(commands.resetCommand(2, "c"), OutOfRangeException);
+    source.resetCommand(1, source.getCommand(1));
+    EXPECT_EQ(joined(wordsOf(source)), "a|b");
+    EXPECT_EQ(joined(wordsOf(copy)), "other|b");
+    EXPECT_EQ(joined(wordsOf(assigned)), "a|b|c");
+    EXPECT_THROW(source.resetCommand(2, "c"), OutOfRangeException);
 }
 
 struct PositionCase {
-    const char* name;
-    Words before;
-    Words incremented;
-    Words decremented;
+    const char* before;
+    const char* incremented;
+    const char* decremented;
     const char* message;  ///< of decrementPositions, which then yields false; null where it yields true
 };
 
+constexpr const char* lowest = "Position should start from 1.\n";
+constexpr const char* noNumber = "Expect an integer after -p|-position.\n";
 const PositionCase positionCases[] = {
-    {"empty set", {}, {}, {}, nullptr},
-    {"no position", {"cmd", "3"}, {"cmd", "3"}, {"cmd", "3"}, nullptr},
-    {"a list ends at the next switch",
-     {"assign", "-p", "1", "2", "-file", "x", "3"},
-     {"assign", "-p", "2", "3", "-file", "x", "3"},
-     {"assign", "-p", "0", "1", "-file", "x", "3"},
-     nullptr},
-    {"long name, any case", {"-POSITION", "9"}, {"-POSITION", "10"}, {"-POSITION", "8"}, nullptr},
-    {"only the whole switch", {"-pos", "9"}, {"-pos", "9"}, {"-pos", "9"}, nullptr},
-    {"zero", {"-p", "0"}, {"-p", "1"}, {"-p", "0"}, "Position should start from 1.\n"},
-    {"no number", {"-p", "x"}, {"-p", "1"}, {"-p", "x"}, "Expect an integer after -p|-position.\n"},
-    {"empty", {"-p", ""}, {"-p", "1"}, {"-p", ""}, "Expect an integer after -p|-position.\n"},
-    {"stops at the first fault",
-     {"-p", "2", "x", "3"},
-     {"-p", "3", "1", "4"},
-     {"-p", "1", "x", "3"},
-     "Expect an integer after -p|-position.\n"},
-    {"stays within 32 bits", {"-p", "2147483647"}, {"-p", "2147483647"}, {"-p", "2147483646"}, nullptr},
+    {"cmd|3", "cmd|3", "cmd|3", nullptr},
+    {"assign|-p|1|2|-file|x|3", "assign|-p|2|3|-file|x|3", "assign|-p|0|1|-file|x|3", nullptr},
+    {"-POSITION|9", "-POSITION|10", "-POSITION|8", nullptr},
+    {"-pos|9", "-pos|9", "-pos|9", nullptr},
+    {"-p|0", "-p|1", "-p|0", lowest},
+    {"-p|x", "-p|1", "-p|x", noNumber},
+    {"-p|", "-p|1", "-p|", noNumber},
+    {"-p|2|x|3", "-p|3|1|4", "-p|1|x|3", noNumber},
+    {"-p|2147483647", "-p|2147483647", "-p|2147483646", nullptr},
 };
 
 TEST(CommandSet, MovesPositionsByOne) {
     for (const PositionCase& c : positionCases) {
         const MessageRecorder messages;
         CommandSet up = setOf(c.before);
-        EXPECT_TRUE(up.incrementPositions()) << c.name;
-        EXPECT_EQ(wordsOf(up), c.incremented) << c.name;
-        EXPECT_TRUE(messages.all().empty()) << c.name;
+        EXPECT_TRUE(up.incrementPositions() && messages.all().empty()) << c.before;
+        EXPECT_EQ(joined(wordsOf(up)), c.incremented);
         CommandSet down = setOf(c.before);
-        EXPECT_EQ(down.decrementPositions(), c.message == nullptr) << c.name;
-        EXPECT_EQ(wordsOf(down), c.decremented) << c.name;
-        EXPECT_EQ(messages.info(), c.message != nullptr ? Words{c.message} : Words()) << c.name;
+        EXPECT_EQ(down.decrementPositions(), c.message == nullptr) << c.before;
+        EXPECT_EQ(joined(wordsOf(down)), c.decremented);
+        EXPECT_EQ(messages.info(), c.message != nullptr ? Words{c.message} : Words()) << c.before;
     }
+    EXPECT_TRUE(CommandSet().incrementPositions() && CommandSet().decrementPositions());
 }
 
 TEST(CommandSet, PrintsItsLine) {
     const MessageRecorder messages;
-    const CommandSet commands = setOf({"a", "%s", "b c"});
+    const CommandSet commands = setOf("a|%s|b c");
     commands.printCommands(true);
     commands.printCommands(false);
     CommandSet().printCommands(true);

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <array>
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -14,34 +15,19 @@ namespace {
 using Texts = std::vector<std::string>;
 
 TEST(FileUtility, TakesPathsApart) {
-    struct Case {
-        const char* path;
-        const char* tail;
-        const char* head;
-        const char* base;
+    // A path, its tail, head and base.
+    const std::array<const char*, 4> cases[] = {
+        {"", "", "", ""},      {".x", ".x", ".x", ""},      {"abc", "abc", "abc", "abc"},
+        {"\\", "", "", "\\"},  {"a.b/c", "c", "a.b", "a"},  {"a/b\\c", "c", "a/b", "a/b\\c"},
+        {"/x", "x", "", "/x"}, {"abc/", "", "abc", "abc/"}, {"a.t.z", "a.t.z", "a.t.z", "a.t"},
+        {nullptr, "", "", ""}, {"a//b", "b", "a/", "a//b"},
     };
-    const Case cases[] = {
-        {"a/b\\c", "c", "a/b", "a/b\\c"},
-        {"abc", "abc", "abc", "abc"},
-        {"abc/", "", "abc", "abc/"},
-        {"/x", "x", "", "/x"},
-        {"\\", "", "", "\\"},
-        {"", "", "", ""},
-        {nullptr, "", "", ""},
-        {"a.tar.gz", "a.tar.gz", "a.tar.gz", "a.tar"},
-        {"a.b/c", "c", "a.b", "a"},
-        {".x", ".x", ".x", ""},
-        {"a//b", "b", "a/", "a//b"},
-    };
-    for (const Case& c : cases) {
-        SCOPED_TRACE(c.path != nullptr ? c.path : "null");
-        EXPECT_STREQ(FileUtility::getTail(c.path), c.tail);
-        EXPECT_STREQ(FileUtility::getHead(c.path), c.head);
-        EXPECT_STREQ(FileUtility::getBase(c.path), c.base);
+    for (const auto& [path, tail, head, base] : cases) {
+        SCOPED_TRACE(path != nullptr ? path : "null");
+        EXPECT_STREQ(FileUtility::getTail(path), tail);
+        EXPECT_STREQ(FileUtility::getHead(path), head);
+        EXPECT_STREQ(FileUtility::getBase(path), base);
     }
-}
-
-TEST(FileUtility, KnowsObjectFilesByTheirExtension) {
     for (const char* path : {"a.ELF", "b.Mem", "d.x/a.b.elf"}) {
         EXPECT_TRUE(FileUtility::isObjectFile(path)) << path;
     }
@@ -52,33 +38,25 @@ TEST(FileUtility, KnowsObjectFilesByTheirExtension) {
 
 TEST(FileUtility, RmdirRemovesTreesAndAlwaysYieldsTrue) {
     const TemporaryDirectory directory;
-    HkFile::mkdir((directory / "tree/a/b").c_str(), true);
-    HkFile::mkdir((directory / "tree/.hidden").c_str(), true);
     directory.write("tree/a/b/file", "x");
     directory.write("tree/.hidden/.file", "x");
     const std::string file = directory.write("file", "kept");
-    EXPECT_TRUE(FileUtility::rmdir((directory / "tree").c_str()));
-    EXPECT_FALSE(HkFile::exist((directory / "tree").c_str()));
-    for (const char* path : {file.c_str(), (directory / "absent").c_str(), "", static_cast<const char*>(nullptr)}) {
+    const std::string tree = directory / "tree";
+    for (const char* path : {tree.c_str(), tree.c_str(), file.c_str(), "", static_cast<const char*>(nullptr)}) {
         EXPECT_TRUE(FileUtility::rmdir(path));
+        EXPECT_FALSE(HkFile::exist(tree.c_str()));
     }
     EXPECT_EQ(directory.read("file"), "kept");
 }
 
-TEST(FileUtility, CopyFileMakesTheDestination) {
-    const TemporaryDirectory directory;
-    const MessageRecorder recorder;
-    directory.write("file", "content");
-    EXPECT_TRUE(FileUtility::copyFile(directory.path().c_str(), (directory / "new/sub").c_str(), "file"));
-    EXPECT_EQ(directory.read("new/sub/file"), "content");
-    EXPECT_TRUE(recorder.all().empty());
-}
-
-TEST(FileUtility, CopyFileReportsWhatFails) {
+TEST(FileUtility, CopyFileMakesTheDestinationOrReportsWhatFails) {
     const TemporaryDirectory directory;
     const MessageRecorder recorder;
     const std::string& from = directory.path();
     const std::string blocked = directory.write("file", "content") + "/sub";
+    EXPECT_TRUE(FileUtility::copyFile(from.c_str(), (directory / "new/sub").c_str(), "file"));
+    EXPECT_EQ(directory.read("new/sub/file"), "content");
+    EXPECT_TRUE(recorder.all().empty());
     EXPECT_FALSE(FileUtility::copyFile(from.c_str(), blocked.c_str(), "file"));
     EXPECT_FALSE(FileUtility::copyFile(from.c_str(), (directory / "new").c_str(), "absent"));
     EXPECT_FALSE(FileUtility::copyFile(from.c_str(), from.c_str(), "file"));
@@ -95,70 +73,36 @@ TEST(FileUtility, CopyFileReportsWhatFails) {
     EXPECT_EQ(directory.read("file"), "content");
 }
 
-/// Makes a directory the current one while it lives.
-class CurrentDirectory {
-public:
-    explicit CurrentDirectory(const std::string& path) : m_former(std::filesystem::current_path()) {
-        std::filesystem::current_path(path);
-    }
-    ~CurrentDirectory() { std::filesystem::current_path(m_former); }
-    CurrentDirectory(const CurrentDirectory&) = delete;
-    CurrentDirectory& operator=(const CurrentDirectory&) = delete;
-
-private:
-    std::filesystem::path m_former;
-};
-
 TEST(FileUtility, ConvertPathGivesFullPaths) {
     const TemporaryDirectory directory;
-    HkFile::mkdir((directory / "a/b").c_str(), true);
-    const CurrentDirectory current(directory / "a/b");
+    const std::filesystem::path former = std::filesystem::current_path();
+    std::filesystem::current_path(directory.make("a/b"));
     const std::string b = HkFile::getcwd().c_str();
     const std::string a = b.substr(0, b.size() - 2);
     const std::string top = b.substr(0, b.size() - 4);
-    const std::string tooHigh = [] {
-        std::string path;
-        for (int i = 0; i < 100; ++i) {
-            path += "../";
-        }
-        return path + "x";
-    }();
-    struct Case {
-        std::string path;
-        std::string base;
-        std::string result;
-    };
-    const Case cases[] = {
-        {"/x/../y", "base", "/x/../y"},
-        {"\\x", "base", "\\x"},
-        {"c:foo", "base", "c:foo"},
-        {"../x:y", "", "../x:y"},
-        {"r/s", "/p/q", "/p/q/r/s"},
-        {"./r/s", "/p/q", "/p/q/r/s"},
-        {".//.\\\\r", "/p/q", "/p/q/r"},
-        {"./../r", "/p/q", "/p/r"},
-        {"./../r", "\\p\\q", "\\p/r"},
-        {"./../../r", "/p/q", "/r"},
-        {"./../../../r", "/p/q", "/p/q/r"},
-        {"", "/p/q", "/p/q/"},
-        {"..", "/p/q", "/p/q/"},
-        {"r/../.s", "/p/q", "/p/q/r/../.s"},
-        {"r", "", b + "/r"},
-        {"", "", b + "/"},
-        {"..", "", b + "/"},
-        {"../", "", a + "/"},
-        {"..\\x", "/p/q", a + "/x"},
-        {"../../d/e.txt", "/p/q", top + "/d/e.txt"},
-        {tooHigh, "", b + "/x"},
-    };
-    for (const Case& c : cases) {
-        const MessageRecorder recorder;
-        EXPECT_STREQ(FileUtility::convertPath(c.path.c_str(), c.base.c_str()), c.result.c_str()) << c.path;
-        const bool isThere = c.path == c.result || HkFile::exist(c.result.c_str());
-        EXPECT_EQ(recorder.info(), isThere ? Texts()
-                                           : Texts{"Path does not exist. Please check the path parameters " + c.path +
-                                                   ", " + c.base + "\n"});
+    std::string tooHigh = "x";
+    for (int i = 0; i < 100; ++i) {
+        tooHigh.insert(0, "../");
     }
+    // A path, its base, the result.
+    const std::array<std::string, 3> cases[] = {
+        {"", "", b + "/"},       {tooHigh, "", b + "/x"},     {"./../../r", "/p/q", "/r"},
+        {"r", "", b + "/r"},     {"../x:y", "", "../x:y"},    {"./r/s", "/p/q", "/p/q/r/s"},
+        {"..", "", b + "/"},     {"..\\x", "/p", a + "/x"},   {"./../r", "\\p\\q", "\\p/r"},
+        {"../", "", a + "/"},    {"c:foo", "base", "c:foo"},  {"/x/../y", "base", "/x/../y"},
+        {"", "/p/q", "/p/q/"},   {"./../r", "/p/q", "/p/r"},  {"r/../.s", "/p", "/p/r/../.s"},
+        {"\\x", "base", "\\x"},  {"r/s", "/p/q", "/p/q/r/s"}, {"../../d/e", "/p", top + "/d/e"},
+        {"..", "/p/q", "/p/q/"}, {".//.\\\\r", "/q", "/q/r"}, {"./../../../r", "/p/q", "/p/q/r"},
+    };
+    for (const auto& [path, base, result] : cases) {
+        const MessageRecorder recorder;
+        EXPECT_STREQ(FileUtility::convertPath(path.c_str(), base.c_str()), result.c_str()) << path;
+        const std::string absence =
+            "Path does not exist. Please check the path parameters " + path + ", " + base + "\n";
+        const bool isThere = path == result || HkFile::exist(result.c_str());
+        EXPECT_EQ(recorder.info(), isThere ? Texts() : Texts{absence});
+    }
+    std::filesystem::current_path(former);
 }
 
 TEST(FileUtility, ConvertPathRefusesOtherDotsAtTheFront) {

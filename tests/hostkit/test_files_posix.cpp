@@ -17,62 +17,39 @@
 
 namespace {
 
-bool isThere(const std::string& path) {
+/// All zero where there is nothing.
+struct stat statusOf(const std::string& path) {
     struct stat status {};
-    return ::lstat(path.c_str(), &status) == 0;
+    ::lstat(path.c_str(), &status);
+    return status;
 }
 
-mode_t rightsOf(const std::string& path) {
-    struct stat status {};
-    return ::stat(path.c_str(), &status) == 0 ? status.st_mode & 0777 : 0;
+bool isThere(const std::string& path) {
+    return statusOf(path).st_mode != 0;
 }
 
 void makeLink(const std::string& target, const std::string& link) {
     ASSERT_EQ(::symlink(target.c_str(), link.c_str()), 0);
 }
 
-/// Takes the root's rights away while it lives; others have none to lose.
-class WithoutPrivileges {
-public:
-    WithoutPrivileges() {
-        if (m_isRoot) {
-            EXPECT_EQ(::seteuid(nobody), 0);
-        }
-    }
-    ~WithoutPrivileges() {
-        if (m_isRoot) {
-            EXPECT_EQ(::seteuid(0), 0);
-        }
-    }
-    WithoutPrivileges(const WithoutPrivileges&) = delete;
-    WithoutPrivileges& operator=(const WithoutPrivileges&) = delete;
-
-private:
-    static constexpr uid_t nobody = 65534;
-    const bool m_isRoot = ::geteuid() == 0;
-};
-
 TEST(TreeRemoval, RemovesLinksAndFollowsNone) {
     const TemporaryDirectory directory;
-    HkFile::mkdir((directory / "victim/sub").c_str(), true);
+    directory.make("victim/sub");
+    directory.make("tree/sub/empty");
     const std::string file = directory.write("victim/file", "kept");
     const std::string tree = directory / "tree";
-    HkFile::mkdir((tree + "/sub/empty").c_str(), true);
     makeLink(directory / "victim", tree + "/to directory");
     makeLink("../../victim", tree + "/sub/relative");
     makeLink(file, tree + "/to file");
-    makeLink(directory / "absent", tree + "/dangling");
     makeLink("itself", tree + "/itself");
     makeLink("..", tree + "/to parent");
-    directory.write("tree/new\nline", "");
-    directory.write("tree/back\\slash", "");
-    directory.write("tree/.hidden", "");
-    EXPECT_TRUE(HkFile::rmtree(tree.c_str()));
-    EXPECT_FALSE(isThere(tree));
+    for (const char* name : {"tree/new\nline", "tree/back\\slash", "tree/.hidden"}) {
+        directory.write(name, "");
+    }
+    EXPECT_TRUE(HkFile::rmtree(tree.c_str()) && !isThere(tree));
     for (const char* ending : {"", "/", "\\"}) {
         makeLink(directory / "victim", tree);
-        EXPECT_TRUE(HkFile::rmtree((tree + ending).c_str()));
-        EXPECT_FALSE(isThere(tree));
+        EXPECT_TRUE(HkFile::rmtree((tree + ending).c_str()) && !isThere(tree)) << ending;
     }
     EXPECT_FALSE(HkFile::rmtree(file.c_str()));
     EXPECT_EQ(directory.read("victim/file"), "kept");
@@ -91,39 +68,35 @@ TEST(TreeRemoval, RemovesTreesDeeperThanPathsReach) {
     }
     ::close(::openat(place, "file", O_CREAT | O_WRONLY, 0600));
     ::close(place);
-    EXPECT_TRUE(HkFile::rmtree((directory / "deep").c_str()));
-    EXPECT_FALSE(isThere(directory / "deep"));
+    EXPECT_TRUE(HkFile::rmtree((directory / "deep").c_str()) && !isThere(directory / "deep"));
 }
 
+// Root gives its rights up meanwhile; others have none to lose.
 TEST(TreeRemoval, GoesOnPastWhatStays) {
     const TemporaryDirectory directory;
     ASSERT_EQ(::chmod(directory.path().c_str(), 0777), 0);
-    const std::string tree = directory / "tree";
-    {
-        const WithoutPrivileges user;
-        for (const char* name : {"unwritable", "unsearchable", "free", "unreadable but empty"}) {
-            HkFile::mkdir((tree + "/" + name).c_str(), true);
-        }
-        for (const char* name : {"unwritable/file", "unsearchable/file", "free/file", "file"}) {
-            directory.write(std::string("tree/") + name, "");
-        }
-        ::chmod((tree + "/unwritable").c_str(), 0500);
-        ::chmod((tree + "/unsearchable").c_str(), 0600);
-        ::chmod((tree + "/unreadable but empty").c_str(), 0);
-        EXPECT_FALSE(HkFile::rmtree(tree.c_str()));
-    }
-    EXPECT_TRUE(isThere(tree + "/unwritable/file") || ::geteuid() != 0);
-    EXPECT_FALSE(isThere(tree + "/free"));
-    EXPECT_FALSE(isThere(tree + "/file"));
-    EXPECT_FALSE(isThere(tree + "/unreadable but empty"));
+    constexpr uid_t nobody = 65534;
+    const uid_t user = ::geteuid();
+    ASSERT_EQ(::seteuid(user == 0 ? nobody : user), 0);
+    const std::string tree = directory.make("tree");
+    const std::string unwritable = directory.write("tree/unwritable/file", "");
+    const std::string unsearchable = directory.write("tree/unsearchable/file", "");
+    const std::string unreadable = directory.make("tree/unreadable but empty");
+    directory.write("tree/free/file", "");
+    directory.write("tree/file", "");
+    ::chmod((tree + "/unwritable").c_str(), 0500);
+    ::chmod((tree + "/unsearchable").c_str(), 0600);
+    ::chmod(unreadable.c_str(), 0);
+    EXPECT_FALSE(HkFile::rmtree(tree.c_str()));
+    EXPECT_EQ(::seteuid(user), 0);
+    EXPECT_FALSE(isThere(tree + "/free") || isThere(tree + "/file") || isThere(unreadable));
     ::chmod((tree + "/unwritable").c_str(), 0700);
     ::chmod((tree + "/unsearchable").c_str(), 0700);
-    EXPECT_TRUE(isThere(tree + "/unwritable/file") && isThere(tree + "/unsearchable/file"));
+    EXPECT_TRUE(isThere(unwritable) && isThere(unsearchable));
 }
 
 TEST(TreeRemoval, IsNotLedAwayByALinkPutInADirectorysPlace) {
     const TemporaryDirectory directory;
-    HkFile::mkdir((directory / "victim").c_str(), false);
     directory.write("victim/file", "kept");
     std::atomic<bool> isOver{false};
     std::thread swapper([&] {
@@ -137,7 +110,7 @@ TEST(TreeRemoval, IsNotLedAwayByALinkPutInADirectorysPlace) {
         }
     });
     for (int i = 0; i < 150; ++i) {
-        HkFile::mkdir((directory / "tree/sub/below").c_str(), true);
+        directory.make("tree/sub/below");
         HkFile::rmtree((directory / "tree").c_str());
     }
     isOver = true;
@@ -145,34 +118,26 @@ TEST(TreeRemoval, IsNotLedAwayByALinkPutInADirectorysPlace) {
     EXPECT_EQ(directory.read("victim/file"), "kept");
 }
 
-TEST(HkFileCopy, KeepsAccessRightsAndLinks) {
+TEST(HkFileCopy, KeepsAccessRightsAndLinksAndTakesRegularFilesOnly) {
     const TemporaryDirectory directory;
     const std::string source = directory.write("source", "new");
     const std::string old = directory.write("old", "former");
+    const std::string fifo = directory / "fifo";
     ::chmod(source.c_str(), 0500);
     ::chmod(old.c_str(), 0666);
     makeLink("old", directory / "link");
     EXPECT_TRUE(HkFile::copy(source.c_str(), (directory / "link").c_str()));
-    EXPECT_EQ(directory.read("old"), "new");
-    EXPECT_EQ(rightsOf(old), 0666U);
     EXPECT_TRUE(HkFile::copy(source.c_str(), (directory / "copy").c_str()));
-    EXPECT_EQ(rightsOf(directory / "copy"), 0500U);
-    EXPECT_FALSE(HkFile::copy(old.c_str(), (directory / "link").c_str()));
-    ASSERT_EQ(::link(old.c_str(), (directory / "hard").c_str()), 0);
-    EXPECT_FALSE(HkFile::copy(old.c_str(), (directory / "hard").c_str()));
-    EXPECT_EQ(directory.read("hard"), "new");
-}
-
-TEST(HkFileCopy, TakesRegularFilesOnly) {
-    const TemporaryDirectory directory;
-    const std::string fifo = directory / "fifo";
-    const std::string file = directory.write("file", "kept");
-    ASSERT_EQ(::mkfifo(fifo.c_str(), 0600), 0);
-    EXPECT_FALSE(HkFile::copy(fifo.c_str(), file.c_str()));
-    EXPECT_FALSE(HkFile::copy(file.c_str(), fifo.c_str()));
-    EXPECT_FALSE(HkFile::copy(file.c_str(), "/dev/null"));
+    EXPECT_EQ(directory.read("old"), "new");
+    ASSERT_TRUE(::mkfifo(fifo.c_str(), 0600) == 0 && ::link(old.c_str(), (directory / "hard").c_str()) == 0);
+    EXPECT_EQ(statusOf(old).st_mode & 0777U, 0666U);
+    EXPECT_EQ(statusOf(directory / "copy").st_mode & 0777U, 0500U);
+    for (const std::string& other : {directory / "link", directory / "hard", fifo, std::string("/dev/null")}) {
+        EXPECT_FALSE(HkFile::copy(old.c_str(), other.c_str())) << other;
+    }
+    EXPECT_FALSE(HkFile::copy(fifo.c_str(), old.c_str()));
     EXPECT_EQ(HkFile::getsize_noopen("/dev/zero"), 0);
-    EXPECT_EQ(directory.read("file"), "kept");
+    EXPECT_EQ(directory.read("hard"), "new");
 }
 
 TEST(HkFileCopy, LeavesTheOldFileWhenThereIsNoRoom) {

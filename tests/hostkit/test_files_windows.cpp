@@ -17,7 +17,6 @@ void protect(const std::string& path) {
 
 TEST(TreeRemoval, RemovesProtectedFilesAndGoesOnPastThoseInUse) {
     const TemporaryDirectory directory;
-    HkFile::mkdir((directory / "tree/sub/deep").c_str(), true);
     protect(directory.write("tree/protected", ""));
     const std::string used = directory.write("tree/sub/used", "");
     directory.write("tree/sub/deep/free", "");
@@ -25,11 +24,11 @@ TEST(TreeRemoval, RemovesProtectedFilesAndGoesOnPastThoseInUse) {
     ASSERT_NE(user, INVALID_HANDLE_VALUE);
     EXPECT_FALSE(HkFile::rmtree((directory / "tree").c_str()));
     EXPECT_TRUE(HkFile::exist(used.c_str()));
-    EXPECT_FALSE(HkFile::exist((directory / "tree/protected").c_str()));
-    EXPECT_FALSE(HkFile::exist((directory / "tree/sub/deep").c_str()));
+    for (const char* gone : {"tree/protected", "tree/sub/deep"}) {
+        EXPECT_FALSE(HkFile::exist((directory / gone).c_str())) << gone;
+    }
     CloseHandle(user);
-    EXPECT_TRUE(HkFile::rmtree((directory / "tree\\").c_str()));
-    EXPECT_FALSE(HkFile::exist((directory / "tree").c_str()));
+    EXPECT_TRUE(HkFile::rmtree((directory / "tree\\").c_str()) && !HkFile::exist((directory / "tree").c_str()));
 }
 
 TEST(TreeRemoval, RemovesDeepTrees) {
@@ -45,9 +44,8 @@ TEST(TreeRemoval, RemovesDeepTrees) {
 // The runtime that the tests have shows links of its own host as reparse points, but cannot make or remove any.
 TEST(TreeRemoval, StopsAtReparsePoints) {
     const TemporaryDirectory directory;
-    HkFile::mkdir((directory / "victim").c_str(), false);
-    HkFile::mkdir((directory / "tree").c_str(), false);
     directory.write("victim/file", "kept");
+    directory.make("tree");
     const std::string link = directory / "tree/link";
     if (CreateSymbolicLinkA(link.c_str(), (directory / "victim").c_str(), SYMBOLIC_LINK_FLAG_DIRECTORY) == 0 ||
         !HkFile::exist(link.c_str())) {
@@ -82,8 +80,7 @@ TEST(HkFileCopy, RefusesAProtectedDestination) {
     protect(old);
     EXPECT_FALSE(HkFile::copy(source.c_str(), old.c_str()));
     EXPECT_EQ(directory.read("old"), "kept");
-    EXPECT_TRUE(HkFile::remove_f(old.c_str()));
-    EXPECT_TRUE(HkFile::remove_f(source.c_str()));
+    EXPECT_TRUE(HkFile::remove_f(old.c_str()) && HkFile::remove_f(source.c_str()));
     EXPECT_TRUE(HkFile::rmdir(directory.path().c_str()));  // no temporary file is left
 }
 

@@ -12,6 +12,7 @@
 #include "DataPath.h"
 #include "ProfileConfig.h"
 #include "ProfileKeyTable.h"
+#include "TemporaryDirectory.h"
 
 namespace fs = std::filesystem;
 
@@ -34,16 +35,9 @@ inline std::unique_ptr<ProfileKeyTable> openTable(const std::string& file, const
 /// A directory of the test's own, which is the search path while the test runs.
 class KeyedFiles : public testing::Test {
 protected:
-    void SetUp() override {
-        const auto* const test = testing::UnitTest::GetInstance()->current_test_info();
-        m_directory = fs::u8path(testing::TempDir()) / (std::string("keyed_") + test->test_suite_name() + test->name());
-        fs::create_directories(m_directory);
-        DeviceProfile::setDataPath(m_directory.u8string().c_str());
-    }
-    void TearDown() override {
-        DeviceProfile::setDataPath(nullptr);
-        fs::remove_all(m_directory);
-    }
+    KeyedFiles() { DeviceProfile::setDataPath(m_temporary.path().c_str()); }
+    ~KeyedFiles() override { DeviceProfile::setDataPath(nullptr); }
 
-    fs::path m_directory;
+    const TemporaryDirectory m_temporary;
+    const fs::path m_directory = fs::u8path(m_temporary.path());
 };

@@ -8,7 +8,6 @@
 namespace {
 
 using testing::ElementsAre;
-using testing::EndsWith;
 using testing::HasSubstr;
 using testing::IsEmpty;
 
@@ -23,8 +22,7 @@ std::string taken(char* text) {
 
 class Config : public KeyedFiles {
 protected:
-    void SetUp() override {
-        KeyedFiles::SetUp();
+    Config() {
         writeFile(m_directory / "tessal.acd", "[base]\nA = 1\n[xz7s10]\nA = 2\n[xz7s20]\n[base]\n[Brennwick-1]\n");
         writeFile(m_directory / "proms.dat", "");
         writeFile(m_directory / "guide.txt", "");
@@ -38,27 +36,19 @@ protected:
 TEST_F(Config, SelectsAndChecksProfiles) {
     const MessageRecorder messages;
     EXPECT_STREQ(m_config.get_profile(), "xz7s10");
-    EXPECT_EQ(m_config.isvalid(1, 1), 1);
-    EXPECT_EQ(m_config.isunsupported(), 0);
-    EXPECT_EQ(m_config.set_profile("xz9"), 1);
-    EXPECT_EQ(m_config.isvalid(0, 1), 1);
-    EXPECT_EQ(m_config.isunsupported(), 1);
-    EXPECT_THAT(messages.info(), IsEmpty());
+    EXPECT_TRUE(m_config.isvalid(1, 1) == 1 && m_config.isunsupported() == 0 && m_config.set_profile("xz9") == 1);
+    EXPECT_TRUE(m_config.isvalid(0, 1) == 1 && m_config.isunsupported() == 1 && messages.info().empty());
     EXPECT_EQ(m_config.isvalid(1, 1), 0);
     EXPECT_THAT(messages.info(), ElementsAre(HasSubstr("[xz9]")));
     for (const char* const name : {"", " xz", "xz ", "x]z", "[xz", "x\nz"}) {
-        EXPECT_EQ(m_config.isvalidprofilename(name, 0), 0) << name;
-        EXPECT_EQ(m_config.set_profile(name), 0) << name;
+        EXPECT_TRUE(m_config.isvalidprofilename(name, 0) == 0 && m_config.set_profile(name) == 0) << name;
     }
     EXPECT_EQ(m_config.set_profile(nullptr), 0);
     EXPECT_STREQ(m_config.get_profile(), "xz9");
-    EXPECT_EQ(messages.info().size(), 1U);
     EXPECT_EQ(m_config.isvalidprofilename("x]z", 1), 0);
-    EXPECT_THAT(messages.info().back(), HasSubstr("\"x]z\""));
+    EXPECT_THAT(messages.info(), ElementsAre(HasSubstr("[xz9]"), HasSubstr("\"x]z\"")));
     DeviceProfile::ProfileConfig none(nullptr, 1, ProfilePartUnbound);
-    EXPECT_EQ(none.get_profile(), nullptr);
-    EXPECT_EQ(none.isvalid(0, 0), 0);
-    EXPECT_EQ(none.isunsupported(), 0);
+    EXPECT_TRUE(none.get_profile() == nullptr && none.isvalid(0, 0) == 0 && none.isunsupported() == 0);
 }
 
 TEST_F(Config, ListsAndPrintsProfiles) {
@@ -83,7 +73,6 @@ TEST_F(Config, NamesDataAndHelpFiles) {
     EXPECT_EQ(taken(m_config.getdatafilename('d', "proms", 1, 0)), path("proms.dat"));
     EXPECT_EQ(taken(m_config.getdatafilename(0, "proms", 1, 0)), "(null)");
     EXPECT_EQ(taken(m_config.getdatafilename('d', "proms", 1, 1)), "(null)");
-    EXPECT_EQ(taken(m_config.getdatafilename('d', "proms", 1, -1)), "(null)");
     EXPECT_EQ(taken(m_config.getdatafilename('a', nullptr, 0, 0)), path("xz7s10.acd"));
     EXPECT_EQ(m_config.GetDatafileName('a', "none", true, 0), "");
     EXPECT_EQ(m_config.GetDatafileName('a', "none", false, 0), path("none.acd").c_str());

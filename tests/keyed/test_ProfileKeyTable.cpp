@@ -1,7 +1,6 @@
 #include <climits>
-#include <random>
+#include <tuple>
 
-#include "DataFileModel.h"
 #include "KeyedFiles.h"
 #include "MessageRecorder.h"
 
@@ -10,51 +9,28 @@ namespace {
 using KeyTable = KeyedFiles;
 
 TEST_F(KeyTable, FindsCellsBySeparatorsAndIndexes) {
-    writeFile(m_directory / "cells.acd", "[base]\nWORD = one\nTABLE = a,b:c,,d:,:e\nEMPTY =\nLONG = x::y:z::\n");
-    struct Case {
-        const char* name;
-        const char* key;
-        const char* rowSeparator;
-        short row;
-        const char* fieldSeparator;
-        short field;
-        const char* cell;
-    };
-    const Case cases[] = {
-        {"whole value", "TABLE", nullptr, 0, nullptr, 0, "a,b:c,,d:,:e"},
-        {"whole value by empty separators", "TABLE", "", 0, "", 0, "a,b:c,,d:,:e"},
-        {"second row of a whole value", "TABLE", nullptr, 1, nullptr, 0, nullptr},
-        {"second field of a whole value", "TABLE", nullptr, 0, nullptr, 1, nullptr},
-        {"cell", "TABLE", ":", 1, ",", 2, "d"},
-        {"empty middle field", "TABLE", ":", 1, ",", 1, ""},
-        {"last empty field", "TABLE", ":", 2, ",", 1, ""},
-        {"field past the row's end", "TABLE", ":", 0, ",", 2, nullptr},
-        {"last row", "TABLE", ":", 3, ",", 0, "e"},
-        {"row past the end", "TABLE", ":", 4, ",", 0, nullptr},
-        {"whole row", "TABLE", ":", 1, nullptr, 0, "c,,d"},
-        {"second field of a whole row", "TABLE", ":", 1, nullptr, 1, nullptr},
-        {"fields of the one row", "TABLE", nullptr, 0, ",", 1, "b:c"},
-        {"other separators on the same key", "TABLE", ",", 1, ":", 1, "c"},
-        {"negative row", "TABLE", ":", -1, ",", 0, nullptr},
-        {"negative field", "TABLE", ":", 0, ",", -1, nullptr},
-        {"lowest indexes", "TABLE", ":", SHRT_MIN, ",", SHRT_MIN, nullptr},
-        {"highest indexes", "TABLE", ":", SHRT_MAX, ",", SHRT_MAX, nullptr},
-        {"no separator in the value", "WORD", ":", 0, ",", 0, "one"},
-        {"empty value", "EMPTY", ",", 0, nullptr, 0, ""},
-        {"past an empty value", "EMPTY", ",", 1, nullptr, 0, nullptr},
-        {"separator of two characters", "LONG", "::", 1, nullptr, 0, "y:z"},
-        {"behind the last separator", "LONG", "::", 2, nullptr, 0, ""},
-        {"equal separators", "TABLE", ",", 1, ",", 0, "b:c"},
-        {"absent key", "NONE", nullptr, 0, nullptr, 0, nullptr},
-        {"key in another case", "word", nullptr, 0, nullptr, 0, nullptr},
-        {"start of a key", "WOR", ":", 0, ",", 0, nullptr},
-        {"empty key", "", nullptr, 0, nullptr, 0, nullptr},
-        {"null key", nullptr, ":", 0, ",", 0, nullptr},
+    writeFile(m_directory / "cells.acd", "[base]\nW = one\nTAB = a,b:c,,d:,:e\nE =\nL = x::y:z::\n");
+    constexpr const char* no = nullptr;
+    // A key, the separator and index of the row and of the field, the cell or null.
+    const std::tuple<const char*, const char*, short, const char*, short, const char*> cases[] = {
+        {"TAB", ":", 1, ",", 2, "d"},  {"TAB", ":", 1, ",", 1, ""},  {"TAB", ":", 2, ",", 1, ""},
+        {"TAB", ":", 3, ",", 0, "e"},  {"TAB", ":", 0, ",", 2, no},  {"TAB", ":", 4, ",", 0, no},
+        {"TAB", ":", -1, ",", 0, no},  {"TAB", ":", 0, ",", -1, no}, {"TAB", ":", 1, no, 0, "c,,d"},
+        {"TAB", ":", 1, no, 1, no},    {"TAB", no, 1, no, 0, no},    {"TAB", no, 0, no, 1, no},
+        {"TAB", no, 0, ",", 1, "b:c"}, {"TAB", ",", 1, ":", 1, "c"}, {"TAB", ",", 1, ",", 0, "b:c"},
+        {"L", "::", 1, no, 0, "y:z"},  {"L", "::", 2, no, 0, ""},    {"W", ":", 0, ",", 0, "one"},
+        {"E", ",", 0, no, 0, ""},      {"E", ",", 1, no, 0, no},     {"NONE", no, 0, no, 0, no},
+        {"w", no, 0, no, 0, no},       {"TA", ":", 0, ",", 0, no},   {"", no, 0, no, 0, no},
+        {no, ":", 0, ",", 0, no},      {"W", "", 0, "", 0, "one"},   {"W", no, 0, no, 0, "one"},
     };
     const auto table = openTable("cells.acd");
-    for (const Case& row : cases) {
-        EXPECT_STREQ(table->getstringbykey(row.key, row.rowSeparator, row.row, row.fieldSeparator, row.field), row.cell)
-            << row.name;
+    int number = 0;
+    for (const auto& [key, rowSeparator, row, fieldSeparator, field, cell] : cases) {
+        EXPECT_STREQ(table->getstringbykey(key, rowSeparator, row, fieldSeparator, field), cell) << "case " << number;
+        ++number;
+    }
+    for (const short extreme : {short{SHRT_MIN}, short{SHRT_MAX}}) {
+        EXPECT_EQ(table->getstringbykey("TAB", ":", extreme, ",", extreme), nullptr);
     }
 }
 
@@ -81,44 +57,17 @@ TEST_F(KeyTable, ReadsNumbersAndGivesZeroWhereThereIsNone) {
     EXPECT_EQ(table->GetInt32ByKey("NONE", nullptr, 0, nullptr, 0), 0);
 }
 
-TEST_F(KeyTable, IndexesUpToTheHighestRow) {
-    std::string rows = "[base]\nT = 0";
-    for (int i = 1; i < 40000; ++i) {
-        rows += ":" + std::to_string(i);
-    }
-    writeFile(m_directory / "rows.acd", rows);
-    const auto table = openTable("rows.acd");
-    EXPECT_STREQ(table->getstringbykey("T", ":", SHRT_MAX, ",", 0), "32767");
-}
-
-TEST_F(KeyTable, ManyKeysInterleavedAnswerAsTheModelDoes) {
-    std::mt19937 random(7);
+TEST_F(KeyTable, FindsManyKeysAndTheLastValueOfEach) {
     std::string bytes = "[base]\n";
-    for (int i = 0; i < 3000; ++i) {
-        bytes += "KEY_" + std::to_string(random() % 2000) + " = ";
-        for (auto length = random() % 12; length != 0; --length) {
-            bytes += "ab,:"[random() % 4];
-        }
-        bytes += "\n";
+    for (int i = 0; i < 6000; ++i) {
+        bytes += "KEY_" + std::to_string(i % 4000) + " = x:" + std::to_string(i) + "\n";
     }
     writeFile(m_directory / "many.acd", bytes);
-    const ModelSection model = modelSection(bytes, "base");
     const MessageRecorder messages;  // keys that are set twice
     const auto table = openTable("many.acd");
-    for (int i = 0; i < 20000; ++i) {
-        const std::string key = "KEY_" + std::to_string(random() % 2000);
-        const auto found = model.find(key);
-        const int row = static_cast<int>(random() % 4);
-        const int field = static_cast<int>(random() % 4);
-        const char* const separators = i % 2 == 0 ? ":," : ",:";
-        const std::string rowSeparator(1, separators[0]);
-        const std::string fieldSeparator(1, separators[1]);
-        const auto expected =
-            found == model.end() ? std::nullopt : modelCell(found->second, rowSeparator, row, fieldSeparator, field);
-        ASSERT_STREQ(table->getstringbykey(key.c_str(), rowSeparator.c_str(), static_cast<short>(row),
-                                           fieldSeparator.c_str(), static_cast<short>(field)),
-                     expected ? expected->c_str() : nullptr)
-            << key << " " << row << " " << field;
+    for (int i = 0; i < 4000; ++i) {
+        const std::string key = "KEY_" + std::to_string(i);
+        ASSERT_EQ(table->GetInt32ByKey(key.c_str(), ":", 1, nullptr, 0), i < 2000 ? i + 4000 : i) << key;
     }
 }
 
