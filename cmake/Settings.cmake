@@ -12,7 +12,7 @@ if(TESSAL_TOP_LEVEL AND TESSAL_CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
 endif()
 
 if(WIN32)
-    set(TESSAL_HOST_LIBRARIES ws2_32 setupapi)
+    set(TESSAL_HOST_LIBRARIES ws2_32 setupapi cfgmgr32)
 endif()
 
 # g++ for 64-bit Windows aligns the stack to 16 bytes and yet moves 32-byte vectors on it with aligned moves; the

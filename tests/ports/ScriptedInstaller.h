@@ -1,0 +1,232 @@
+// A device installer of made-up devices: it records each call, can fail any one of them, and counts what is open.
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstring>
+#include <map>
+#include <string>
+#include <vector>
+
+#include "platform/DeviceInstaller.h"
+
+using platform::ConfigurationKind;
+using platform::DeviceProperty;
+using platform::DeviceRecord;
+using platform::IoRange;
+
+struct FakeDevice {
+    std::string id;
+    std::map<DeviceProperty, std::string> properties;
+    std::map<ConfigurationKind, std::vector<IoRange>> configurations;
+    std::uint32_t status = 0;
+    std::uint32_t problem = 0;
+    std::uint32_t flags = 0;  ///< after its removal
+};
+
+/// Texts as the host keeps a list of them.
+inline std::string asList(const std::vector<std::string>& texts) {
+    std::string list;
+    for (const std::string& text : texts) {
+        list += text + '\0';
+    }
+    return list + '\0';
+}
+
+class ScriptedInstaller : public platform::DeviceInstaller {
+public:
+    std::vector<FakeDevice> devices;
+    std::vector<std::string> calls;
+    std::vector<std::string> removed;
+    std::string failing;      ///< the call that fails, by its text; the first of them
+    std::size_t failAt = 0;   ///< or by its number from 1
+    std::uint32_t error = 5;  ///< the host's number for that failure
+    std::uint32_t classCount = 1;
+    std::uint32_t pathLength = 20;
+    std::uint32_t growth = 0;      ///< bytes by which a property grows at each read
+    std::uint32_t lastDevice = 0;  ///< where an endless host ends after all
+    bool isEndless = false;        ///< more devices and descriptors for ever
+    std::string hardwareIds;       ///< of the device that was registered
+
+    /// Sets, configurations, descriptors and libraries that are open.
+    int openThings() const { return m_open; }
+    bool called(const std::string& call) const { return std::count(calls.begin(), calls.end(), call) != 0; }
+
+    std::uint32_t lastError() override { return m_error; }
+    platform::DeviceSetHandle createSet(const platform::DeviceClass* c) override { return set("createSet", c, "", {}); }
+    platform::DeviceSetHandle createSetOnMachine(const platform::DeviceClass* c) override {
+        return set("createSetOnMachine", c, "", {});
+    }
+    platform::DeviceSetHandle presentDevices(const platform::DeviceClass* c, std::uint32_t flags,
+                                             platform::DeviceSetHandle former) override {
+        std::vector<std::uint32_t> members;
+        for (std::uint32_t i = 0; i < devices.size(); ++i) {
+            members.push_back(i);
+        }
+        if (former == platform::noDeviceSet) {
+            return set("presentDevices", c, " " + std::to_string(flags), members);
+        }
+        m_members = members;
+        return step("presentDevices" + nameOf(c) + " " + std::to_string(flags) + " into") ? former : -1;
+    }
+    bool setDetail(platform::DeviceSetHandle, platform::Machine&) override { return step("setDetail"); }
+    bool deviceAt(platform::DeviceSetHandle, std::uint32_t index, DeviceRecord& device) override {
+        if (index >= (isEndless ? lastDevice : m_members.size())) {
+            return false;
+        }
+        device.node = m_members[index % m_members.size()];
+        return true;
+    }
+    void openDevice(platform::DeviceSetHandle, const char* id) override {
+        step(std::string("openDevice ") + id);
+        for (std::uint32_t i = 0; i < devices.size(); ++i) {
+            if (devices[i].id == id) {
+                m_members.push_back(i);
+            }
+        }
+    }
+    void destroySet(platform::DeviceSetHandle) override { --m_open; }
+
+    bool property(platform::DeviceSetHandle, const DeviceRecord& device, DeviceProperty property, std::uint32_t& type,
+                  char* buffer, std::uint32_t size, std::uint32_t& needed) override {
+        if (!step("property " + std::to_string(static_cast<int>(property)))) {
+            return false;
+        }
+        const auto& properties = devices[device.node].properties;
+        const auto found = properties.find(property);
+        if (found == properties.end()) {
+            m_error = 13;
+            return false;
+        }
+        const bool isList = property == DeviceProperty::HardwareIds || property == DeviceProperty::CompatibleIds;
+        type = isList ? platform::listType : platform::textType;
+        std::string value = found->second;
+        needed = static_cast<std::uint32_t>(value.size()) + m_grown;
+        m_grown += growth;
+        if (needed > size) {
+            m_error = platform::bufferTooSmall;
+            return false;
+        }
+        std::memcpy(buffer, value.data(), value.size());
+        return true;
+    }
+    bool instanceId(const DeviceRecord& device, char* buffer, std::uint32_t size, platform::Machine) override {
+        devices[device.node].id.copy(buffer, size);
+        return step("instanceId");
+    }
+    bool status(const DeviceRecord& device, platform::Machine, std::uint32_t& status, std::uint32_t& problem) override {
+        status = devices[device.node].status;
+        problem = devices[device.node].problem;
+        return step("status");
+    }
+    bool configuration(const DeviceRecord& device, ConfigurationKind kind, platform::Machine,
+                       platform::LogicalConfiguration& configuration) override {
+        const auto& all = devices[device.node].configurations;
+        const auto found = all.find(kind);
+        if (!step("configuration " + std::to_string(static_cast<int>(kind))) || found == all.end()) {
+            return false;
+        }
+        m_ranges = found->second;
+        configuration = firstDescriptor - 1;
+        ++m_open;
+        return true;
+    }
+    bool nextIoDescriptor(std::uintptr_t previous, platform::ResourceDescriptor& descriptor) override {
+        descriptor = previous + 1;
+        if (!step("nextIoDescriptor") || (!isEndless && descriptor - firstDescriptor >= m_ranges.size())) {
+            return false;
+        }
+        ++m_open;
+        return true;
+    }
+    bool ioRange(platform::ResourceDescriptor descriptor, IoRange& range) override {
+        range = m_ranges[(descriptor - firstDescriptor) % m_ranges.size()];
+        return step("ioRange");
+    }
+    void freeDescriptor(platform::ResourceDescriptor) override { --m_open; }
+    void freeConfiguration(platform::LogicalConfiguration) override { --m_open; }
+
+    std::uint32_t fullPath(const char* file, char* buffer, std::uint32_t size) override {
+        if (!step(std::string("fullPath ") + file)) {
+            return 0;
+        }
+        std::string(file).copy(buffer, size);
+        return pathLength;
+    }
+    bool setupFileClass(const char* path, platform::DeviceClass& c, char* name, std::uint32_t size) override {
+        c = platform::cableClass;
+        std::string("Cables").copy(name, size);
+        return step(std::string("setupFileClass ") + path) && *path != '\0';
+    }
+    bool classOfName(const char* name, platform::DeviceClass& c, std::uint32_t& count) override {
+        c = platform::portsClass;
+        count = classCount;
+        return step(std::string("classOfName ") + name);
+    }
+    bool createDevice(platform::DeviceSetHandle, const char* name, const platform::DeviceClass& c,
+                      DeviceRecord&) override {
+        return step(std::string("createDevice ") + name + nameOf(&c));
+    }
+    bool storeHardwareIds(platform::DeviceSetHandle, DeviceRecord&, const char* list, std::uint32_t bytes) override {
+        hardwareIds.assign(list, bytes);
+        return step("storeHardwareIds");
+    }
+    bool callInstaller(platform::InstallFunction function, platform::DeviceSetHandle, DeviceRecord& device) override {
+        const bool isDone = step("callInstaller " + std::to_string(static_cast<int>(function)));
+        if (isDone && function == platform::InstallFunction::Remove) {
+            removed.push_back(devices[device.node].id);
+        }
+        return isDone;
+    }
+    bool prepareRemoval(platform::DeviceSetHandle, DeviceRecord&) override { return step("prepareRemoval"); }
+    bool installFlags(platform::DeviceSetHandle, const DeviceRecord& device, std::uint32_t& flags) override {
+        flags = devices[device.node].flags;
+        return step("installFlags");
+    }
+    platform::LibraryHandle loadLibrary(const char* file) override {
+        if (!step(std::string("loadLibrary ") + file)) {
+            return nullptr;
+        }
+        ++m_open;
+        return this;
+    }
+    platform::UpdateEntry findEntry(platform::LibraryHandle, const char* name) override {
+        return step(std::string("findEntry ") + name) ? +[] {} : nullptr;
+    }
+    void updateDriver(platform::UpdateEntry, const char* hardwareId, const char* path) override {
+        step(std::string("updateDriver ") + hardwareId + " " + path);
+    }
+    void freeLibrary(platform::LibraryHandle) override { --m_open; }
+
+private:
+    static constexpr std::uintptr_t firstDescriptor = 1000;
+
+    static std::string nameOf(const platform::DeviceClass* c) {
+        return c == nullptr ? "" : c->data1 == platform::portsClass.data1 ? " Ports" : " Cables";
+    }
+    bool step(const std::string& call) {
+        calls.push_back(call);
+        const bool fails = calls.size() == failAt || call == failing;
+        if (fails) {
+            m_error = error;
+            failing.clear();
+        }
+        return !fails;
+    }
+    platform::DeviceSetHandle set(const char* call, const platform::DeviceClass* c, const std::string& more,
+                                  const std::vector<std::uint32_t>& members) {
+        if (!step(call + nameOf(c) + more)) {
+            return platform::noDeviceSet;
+        }
+        m_members = members;
+        ++m_open;
+        return 7;
+    }
+
+    std::vector<std::uint32_t> m_members;
+    std::vector<IoRange> m_ranges;
+    std::uint32_t m_error = 0;
+    std::uint32_t m_grown = 0;
+    int m_open = 0;
+};
