@@ -9,6 +9,7 @@
 #include "BitView.h"
 #include "BrennwickInfo.h"
 #include "CPortResources.h"
+#include "CableDriver.h"
 #include "CableInfo.h"
 #include "Callback.h"
 #include "CommandSet.h"

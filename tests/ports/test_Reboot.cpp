@@ -1,0 +1,124 @@
+// No test here restarts anything: each puts a scripted piece in the host's place.
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <string>
+#include <vector>
+
+#include "CableDriver.h"
+#include "platform/SystemRestart.h"
+
+namespace {
+
+using Texts = std::vector<std::string>;
+using platform::Privilege;
+using platform::Token;
+
+const char* const title = "Cable Driver Update";
+const char* const first =
+    "The system needs to be restarted to complete the driver update. Select OK to restart the system.";
+const char* const second = "Select OK to restart the system immediately.";
+
+class ScriptedRestart : public platform::SystemRestart {
+public:
+    ScriptedRestart() { platform::replaceSystemRestart(this); }
+    ~ScriptedRestart() override { platform::replaceSystemRestart(nullptr); }
+
+    Texts calls;
+    Texts failing;
+    std::uint32_t error = 0;
+    int openTokens = 0;
+
+    std::uint32_t lastError() override { return error; }
+    int ask(const char* text, const char* caption, std::uint32_t style) override {
+        return step(text) && caption == std::string(title) && style == 1 ? 1 : 2;
+    }
+    bool openThreadToken(std::uint32_t access, Token&) override { return open("thread", access); }
+    bool openProcessToken(std::uint32_t access, Token&) override { return open("process", access); }
+    bool findPrivilege(const char* name, Privilege&) override { return step(name); }
+    bool enablePrivilege(Token, const Privilege&) override { return step("enable"); }
+    void closeToken(Token) override { --openTokens; }
+    bool exitSystem(std::uint32_t flags, std::uint32_t reason) override {
+        return step("exit " + std::to_string(flags) + " " + std::to_string(reason));
+    }
+
+private:
+    bool step(const std::string& call) {
+        calls.push_back(call);
+        return std::count(failing.begin(), failing.end(), call) == 0;
+    }
+    bool open(const char* call, std::uint32_t access) {
+        const bool isOpen = step(call) && access == 0x28;
+        openTokens += isOpen ? 1 : 0;
+        return isOpen;
+    }
+};
+
+std::string outputOfReboot() {
+    testing::internal::CaptureStdout();
+    Reboot();
+    return testing::internal::GetCapturedStdout();
+}
+
+TEST(Reboot, GoesStepByStep) {
+    const std::string privilege = "SeShutdownPrivilege";
+    const std::string leave = "exit 6 0";
+    const struct {
+        Texts failing;
+        std::uint32_t error;
+        Texts calls;  // behind the questions
+    } cases[] = {
+        {{}, 0, {"thread", privilege, "enable", leave}},
+        {{"thread"}, 1008, {"thread", "process", privilege, "enable", leave}},
+        {{"thread"}, 5, {"thread", leave}},
+        {{"thread", "process"}, 1008, {"thread", "process", leave}},
+        {{privilege}, 0, {"thread", privilege, leave}},
+        {{"enable"}, 0, {"thread", privilege, "enable", leave}},
+        {{leave}, 0, {"thread", privilege, "enable", leave}},
+    };
+    for (const auto& c : cases) {
+        SCOPED_TRACE(testing::PrintToString(c.failing));
+        ScriptedRestart host;
+        host.failing = c.failing;
+        host.error = c.error;
+        EXPECT_EQ(outputOfReboot(), c.failing == Texts{leave} ? "ExitWindowsEx Error.\n" : "");
+        Texts calls{first, second};
+        calls.insert(calls.end(), c.calls.begin(), c.calls.end());
+        EXPECT_EQ(host.calls, calls);
+        EXPECT_EQ(host.openTokens, 0);
+    }
+}
+
+TEST(Reboot, ANoEndsIt) {
+    for (const Texts& asked : {Texts{first}, Texts{first, second}}) {
+        ScriptedRestart host;
+        host.failing = {asked.back()};
+        EXPECT_EQ(outputOfReboot(), "");
+        EXPECT_EQ(host.calls, asked);
+    }
+}
+
+TEST(Reboot, UsesTheCallersRestarter) {
+    struct Restarter : SystemRestarter {
+        Texts calls;
+        bool confirm(const char* text, const char* caption) override {
+            calls.push_back(std::string(caption) + ": " + text);
+            return true;
+        }
+        bool restart() override { return false; }
+    } restarter;
+    ScriptedRestart host;
+    setSystemRestarter(&restarter);
+    EXPECT_EQ(outputOfReboot(), "ExitWindowsEx Error.\n");
+    setSystemRestarter(nullptr);
+    EXPECT_EQ(restarter.calls, (Texts{std::string(title) + ": " + first, std::string(title) + ": " + second}));
+    EXPECT_EQ(host.calls, Texts());
+}
+
+TEST(Reboot, DoesNothingOnAHostWithoutARestart) {
+    if (platform::systemRestart() == nullptr) {
+        EXPECT_EQ(outputOfReboot(), "");
+    }
+}
+
+}  // namespace
