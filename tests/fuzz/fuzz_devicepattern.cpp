@@ -1,0 +1,51 @@
+// A pattern chooses the same texts as a plain model, which follows every way that wildcards can go at once.
+#include <cstdint>
+#include <cstdlib>
+#include <string>
+#include <vector>
+
+#include "CableDriver.h"
+#include "HkStr.h"
+
+namespace {
+
+/// Keeps, for each end of the text, whether the pattern up to here matches the text up to there.
+bool matchByModel(const std::string& text, const std::string& pattern, bool hasWildcards) {
+    std::vector<bool> matches(text.size() + 1, false);
+    matches[0] = true;
+    for (const char wanted : pattern) {
+        std::vector<bool> next(text.size() + 1, false);
+        const bool isAny = hasWildcards && wanted == '*';
+        for (std::size_t end = 0; end <= text.size(); ++end) {
+            next[end] = isAny ? matches[end] || (end > 0 && next[end - 1])
+                              : end > 0 && matches[end - 1] && HkStr::ToLower(text[end - 1]) == HkStr::ToLower(wanted);
+        }
+        matches = next;
+    }
+    return matches.back();
+}
+
+bool drop(std::string& text, char prefix) {
+    const bool isThere = !text.empty() && text[0] == prefix;
+    text.erase(0, isThere ? 1 : 0);
+    return isThere;
+}
+
+}  // namespace
+
+/// The input is a pattern and, behind its first line end, a text.
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    const std::string input(reinterpret_cast<const char*>(data), size);
+    const std::size_t end = input.find('\n');
+    std::string pattern = input.substr(0, end).c_str();
+    const std::string text = end != std::string::npos ? input.substr(end + 1).c_str() : "";
+    const std::string whole = pattern;
+    const DeviceIdPattern parsed = parseDeviceIdPattern(whole.c_str());
+    const bool isInstanceId = drop(pattern, '@');
+    const bool isLiteral = drop(pattern, '\'');
+    if ((parsed.m_isInstanceId != 0) != isInstanceId ||
+        matchDeviceId(text.c_str(), parsed) != matchByModel(text, pattern, !isLiteral)) {
+        std::abort();
+    }
+    return 0;
+}
