@@ -5,6 +5,7 @@
 #include <numeric>
 #include <vector>
 
+#include "HkMessageManager.h"
 #include "PromUtility.h"
 #include "benchmarks/Item.h"
 
@@ -61,7 +62,7 @@ __attribute__((target("avx2"))) std::uint64_t vectorSum(const unsigned char* byt
         for (std::size_t k = 0; k < 4; ++k) {
             Bytes block;
             __builtin_memcpy(&block, bytes + i + 32 * k, sizeof block);
-            sums[k] += static_cast<Quad>(__builtin_ia32_psadbw256(block, Bytes{}));
+            sums[k] += reinterpret_cast<Quad>(__builtin_ia32_psadbw256(block, Bytes{}));
         }
     }
     const Quad sum = sums[0] + sums[1] + sums[2] + sums[3];

@@ -80,12 +80,13 @@ void writeByAppending(State& state) {
 
 void writeByStoring(State& state) {
     std::vector<char> message(messageSize);
-    const auto write = [&](int added) {
+    char* const bytes = message.data();
+    const auto write = [bytes](int added) {
         for (int i = 0; i < numbers; ++i) {
-            WireForm::storeInt(message.data() + i * WireForm::intSize, valueAt(i) + added);
+            WireForm::storeInt(bytes + i * WireForm::intSize, valueAt(i) + added);
         }
     };
-    writeMessages(state, write, message.data());
+    writeMessages(state, write, bytes);
 }
 
 const RegisterItem writeItem{{"buffer_write_ints",

@@ -11,6 +11,7 @@ name=tessal_device_test_$$
 [ "$transport" = pipe ] && where=(--pipe "$name") || where=(--tcp 0)
 
 work=$(mktemp -d)
+touch "$work/device"
 timeout 150 "${device[@]}" "${where[@]}" >"$work/device" 2>&1 </dev/null &
 server=$!
 trap 'kill "$server" 2>/dev/null || true; rm -rf "$work"' EXIT
