@@ -5,6 +5,7 @@
 
 #include "DeviceCommands.h"
 #include "Help.h"
+#include "HostCommands.h"
 #include "OptionCommands.h"
 #include "Session.h"
 
@@ -36,9 +37,18 @@ struct Row {
 };
 
 constexpr Row rows[] = {
-    {"closecable", closeCable}, {"custcode", showOptions},  {"erase", showOptions},   {"help", help},
-    {"identify", identify},     {"preference", preference}, {"program", showOptions}, {"quit", quit},
-    {"readback", showOptions},  {"setcable", setCable},     {"verify", showOptions},
+    {"closecable", closeCable},
+    {"custcode", showOptions},
+    {"erase", showOptions},
+    {"help", help},
+    {"identify", identify},
+    {"info", info},
+    {"preference", preference},
+    {"program", showOptions},
+    {"quit", quit},
+    {"readback", showOptions},
+    {"setcable", setCable},
+    {"verify", showOptions},
 };
 
 }  // namespace
