@@ -3,11 +3,11 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <iterator>
 #include <limits>
 #include <sstream>
 #include <string>
 #include <tuple>
-#include <utility>
 #include <vector>
 
 #include "HkStr.h"
@@ -19,28 +19,15 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 
 TEST(CableInfo, EverySpeedConvertsInAllDirections) {
-    const std::pair<int, const char*> displays[] = {{0, "0"},
-                                                    {9600, "9600"},
-                                                    {19200, "19200"},
-                                                    {38400, "38400"},
-                                                    {57600, "57600"},
-                                                    {187000, "187 khz"},
-                                                    {200000, "200 KHZ"},
-                                                    {300000, "300 KHz"},
-                                                    {375000, "375 KHz"},
-                                                    {625000, "625 KHz"},
-                                                    {750000, "750 KHz"},
-                                                    {1250000, "1.25 mhz"},
-                                                    {1500000, "1.5 MHz"},
-                                                    {2500000, "2.5 MHz"},
-                                                    {3000000, "3 MHz"},
-                                                    {5000000, "5 MHz"},
-                                                    {6000000, "6 MHz"},
-                                                    {10000000, "10 MHz"},
-                                                    {12000000, "12 MHz"},
-                                                    {24000000, "24 MHz"}};
+    const int speeds[] = {0,      9600,    19200,   38400,   57600,   187000,  200000,  300000,   375000,   625000,
+                          750000, 1250000, 1500000, 2500000, 3000000, 5000000, 6000000, 10000000, 12000000, 24000000};
+    const char* const displays[] = {"0",       "9600",    "19200",   "38400",   "57600",    "187 khz", "200 KHZ",
+                                    "300 KHz", "375 KHz", "625 KHz", "750 KHz", "1.25 mhz", "1.5 MHz", "2.5 MHz",
+                                    "3 MHz",   "5 MHz",   "6 MHz",   "10 MHz",  "12 MHz",   "24 MHz"};
     const MessageRecorder messages;
-    for (const auto& [speed, display] : displays) {
+    for (std::size_t i = 0; i < std::size(speeds); ++i) {
+        const int speed = speeds[i];
+        const char* const display = displays[i];
         SCOPED_TRACE(display);
         EXPECT_EQ(CableInfo::getSpeedNumber(display), speed);
         EXPECT_EQ(CableInfo::getSpeedNumber(std::to_string(speed).c_str()), speed);
