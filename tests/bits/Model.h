@@ -1,8 +1,10 @@
-// The plain bit vector that the fast ones are compared with: every rule bit by bit, nothing clever.
+// The plain bit vector that the fast ones are compared with: every rule bit by bit, nothing clever. Its operations are
+// those of LRBitVec under the same names.
 #pragma once
 
 #include <algorithm>
 #include <cstdint>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -15,8 +17,8 @@ struct Model {
     Numbering numbering = Numbering::Storage;
 
     Model() = default;
-    Model(std::size_t bits, bool value)
-        : capacity(bits + 7), length(bits), bytes((bits + 14) / 8, value ? 0xFF : 0x00) {}
+    Model(const Model&) = default;
+    explicit Model(std::size_t bits) : capacity(bits + 7), length(bits), bytes((bits + 14) / 8) {}
 
     bool bit(std::size_t p) const { return (bytes.at(p / 8) >> (p % 8) & 1) != 0; }
     void put(std::size_t p, bool value) {
@@ -24,15 +26,11 @@ struct Model {
         byte = static_cast<unsigned char>(value ? byte | 1 << (p % 8) : byte & ~(1 << (p % 8)));
     }
     std::size_t place(std::size_t index) const {
-        switch (numbering) {
-            case Numbering::Mirrored:
-                return index / 8 * 8 + (7 - index % 8);
-            case Numbering::Usual:
-                return length - 1 - index;
-            default:
-                return index;
-        }
+        return numbering == Numbering::Mirrored ? index / 8 * 8 + (7 - index % 8)
+               : numbering == Numbering::Usual  ? length - 1 - index
+                                                : index;
     }
+    bool at(std::size_t index) const { return bit(place(index)); }
 
     void setCapacity(std::size_t bits) {
         const std::size_t former = capacity;
@@ -51,11 +49,10 @@ struct Model {
         }
         put(length++, value);
     }
-    void append(const Model& other) {
-        const std::size_t added = other.length;
+    void concatenate(const Model& other) {
         const Model source = other;
-        setCapacity(length + added + 64);
-        for (std::size_t i = 0; i < added; ++i) {
+        setCapacity(length + source.length + 64);
+        for (std::size_t i = 0; i < source.length; ++i) {
             addBit(source.bit(i));
         }
     }
@@ -82,42 +79,52 @@ struct Model {
             setCapacity(2 * bits);
         }
     }
-    void shiftUp(std::size_t n) {
+    void rightShift(std::size_t n) {
         for (std::size_t i = length; i-- > 0;) {
             put(i, i >= n && bit(i - n));
         }
     }
-    void shiftDown(std::size_t n) {
+    void leftShift(std::size_t n) {
         for (std::size_t i = 0; i < length; ++i) {
             put(i, i + n < length && bit(i + n));
         }
     }
-    void assign(const Model& other) {
-        if (bytes.empty() || other.bytes.empty()) {
-            return;
-        }
-        if (length != other.length) {
-            capacity = other.capacity;
+    Model& operator=(const Model& other) {
+        if (!bytes.empty() && !other.bytes.empty()) {
+            capacity = length != other.length ? other.capacity : capacity;
+            bytes.resize((capacity + 7) / 8);
             length = other.length;
-            bytes.resize(other.bytes.size());
+            std::copy_n(other.bytes.begin(), std::min(bytes.size(), other.bytes.size()), bytes.begin());
         }
-        std::copy_n(other.bytes.begin(), std::min(bytes.size(), other.bytes.size()), bytes.begin());
+        return *this;
     }
-    template <class Operation>
-    void combine(const Model& other, Operation operation) {
-        for (std::size_t i = 0; i < (length + 7) / 8; ++i) {
-            bytes[i] = static_cast<unsigned char>(operation(bytes[i], other.bytes.at(i)));
-        }
+    void operator=(bool value) { std::fill(bytes.begin(), bytes.end(), static_cast<unsigned char>(value ? 0xFF : 0)); }
+    void operator+=(const Model& other) { concatenate(other); }
+    void operator+=(const char* text) { addHex(text); }
+    void operator>>(std::size_t n) { rightShift(n); }
+    void operator<<(std::size_t n) { leftShift(n); }
+    void operator!() {
+        combine(*this, [](int own, int) { return ~own; });
     }
+    void operator&=(const Model& other) { combine(other, std::bit_and<>()); }
+    void operator^=(const Model& other) { combine(other, std::bit_xor<>()); }
+    void operator|=(const Model& other) { combine(other, std::bit_or<>()); }
+
     std::size_t first(bool value) const {
-        for (std::size_t i = 0; i < length; ++i) {
-            if (bit(i) == value) {
-                return i;
-            }
+        std::size_t i = 0;
+        while (i < length && bit(i) != value) {
+            ++i;
         }
-        return 0xFFFFFFFF;
+        return i < length ? i : 0xFFFFFFFF;
     }
-    bool equal(const Model& other) const {
+    std::size_t count() const {
+        std::size_t ones = 0;
+        for (std::size_t i = 0; i < length; ++i) {
+            ones += bit(i) ? 1 : 0;
+        }
+        return ones;
+    }
+    bool operator==(const Model& other) const {
         bool same = length == other.length;
         for (std::size_t i = 0; same && i < length; ++i) {
             same = bit(i) == other.bit(i);
@@ -125,15 +132,23 @@ struct Model {
         return same;
     }
     Model joined(const Model& other) const {
-        Model result(length + other.length, false);
+        Model result(length + other.length);
         for (std::size_t i = 0; i < result.length; ++i) {
-            result.put(result.length - 1 - i, i < length ? bit(place(i)) : other.bit(other.place(i - length)));
+            result.put(result.length - 1 - i, i < length ? at(i) : other.at(i - length));
         }
         return result;
     }
     void field(std::size_t start, const std::vector<bool>& bits) {
         for (std::size_t k = 0; k < bits.size(); ++k) {
             put(place(length - start - 1 - k), bits[k]);
+        }
+    }
+
+private:
+    template <class Operation>
+    void combine(const Model& other, Operation operation) {
+        for (std::size_t i = 0; i < (length + 7) / 8; ++i) {
+            bytes[i] = static_cast<unsigned char>(operation(bytes[i], other.bytes.at(i)));
         }
     }
 };

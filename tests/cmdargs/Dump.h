@@ -2,6 +2,8 @@
 #pragma once
 
 #include <algorithm>
+#include <iomanip>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -9,34 +11,19 @@
 
 using Lines = std::vector<std::string>;
 
-/// Splits at blanks; double quotes hold a word together, and an empty pair is an empty word.
+/// Splits at blanks; double quotes round a word hold it together.
 inline Lines splitCommand(const std::string& line) {
     Lines words;
-    bool quoted = false;
-    bool open = false;
-    for (const char ch : line) {
-        if (ch == ' ' && !quoted) {
-            open = false;
-            continue;
-        }
-        if (!open) {
-            words.emplace_back();
-            open = true;
-        }
-        if (ch == '"') {
-            quoted = !quoted;
-        } else {
-            words.back() += ch;
-        }
+    std::istringstream in(line);
+    for (std::string word; in >> std::quoted(word);) {
+        words.push_back(word);
     }
     return words;
 }
 
 inline std::vector<const char*> pointersTo(const Lines& words) {
-    std::vector<const char*> pointers;
-    for (const std::string& word : words) {
-        pointers.push_back(word.c_str());
-    }
+    std::vector<const char*> pointers(words.size());
+    std::transform(words.begin(), words.end(), pointers.begin(), [](const std::string& word) { return word.c_str(); });
     return pointers;
 }
 

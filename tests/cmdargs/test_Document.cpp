@@ -16,11 +16,6 @@ struct Example {
     Lines expected;
 };
 
-std::string withoutEnd(std::string text) {
-    text.erase(text.find_last_not_of(" \r") + 1);
-    return text;
-}
-
 std::vector<Example> readExamples(const char* path) {
     std::vector<Example> examples;
     std::ifstream file(path);
@@ -28,7 +23,7 @@ std::vector<Example> readExamples(const char* path) {
     std::string format;
     bool inside = false;
     for (int number = 1; std::getline(file, line); ++number) {
-        line = withoutEnd(line);
+        line.erase(line.find_last_not_of(" \r") + 1);
         if (line.rfind("```", 0) == 0) {
             inside = line == "```args";
         } else if (inside && line.rfind("format ", 0) == 0) {

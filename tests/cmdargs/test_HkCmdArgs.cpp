@@ -4,6 +4,8 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <tuple>
+#include <utility>
 #include <vector>
 
 #include "MessageRecorder.h"
@@ -33,101 +35,69 @@ Lines parse(const char* format, const std::string& line) {
 Lines completions(const char* format, const std::string& line, const char* partial) {
     Lines words = splitCommand(line);
     words.emplace_back(partial);
-    Lines result;
-    const int count = static_cast<int>(words.size());
-    for (const HkString& word : HkCmdArgs::complete(count, pointersTo(words).data(), format)) {
-        result.emplace_back(word.view());
-    }
-    return result;
+    const std::vector<HkString> found =
+        HkCmdArgs::complete(static_cast<int>(words.size()), pointersTo(words).data(), format);
+    return {found.begin(), found.end()};
 }
 
 TEST(HkCmdArgs, MalformedFormatsTellPlaceAndReason) {
-    struct Case {
-        const char* format;
-        const char* error;
-    };
-    const Case cases[] = {
+    const std::pair<const char*, const char*> cases[] = {
         {"-p <n=itn>", "character 4: unknown type itn"},
-        {"-p <n=one>", "character 4: unknown type one"},
         {"-p <n=int 5..1>", "character 4: expected a range such as 1..255, not 5..1"},
         {"-p <n=int ..>", "character 4: expected a range such as 1..255, not .."},
         {"-p <hex 0>", "character 4: expected a range such as 1..255, not 0"},
-        {"-p <file 1..2>", "character 4: unexpected 1..2"},
         {"-p <n=int 1..2 3>", "character 4: unexpected 3"},
-        {"-p <group>", "character 4: expected the first words of the group, such as group 0|1 rp wp"},
         {"-p <group |>", "character 4: expected the first words of the group, such as group 0|1 rp wp"},
         {"-p <>", "character 4: expected a name or a type between < and >"},
         {"-p <a b=int>", "character 4: expected <name=type>"},
         {"-p <n", "character 4: the argument has no closing >"},
         {"<-n>", "character 1: the name of an argument begins with no dash"},
-        {"[-p", "character 4: expected ]"},
         {"[-p)", "character 4: expected ]"},
         {"(-p]", "character 4: expected )"},
-        {"{-p}", "character 1: expected } behind at least two arguments"},
         {"{-p -q", "character 1: expected } behind at least two arguments"},
         {"[]", "character 2: expected a -switch, a \"word\" or an <argument>"},
-        {"-p|q", "character 4: expected the name of a switch, a dash and letters"},
         {"-p --", "character 4: expected the name of a switch, a dash and letters"},
         {"-p [-P]", "character 5: the name -p stands twice"},
         {"<file> \"FILE\"", "character 8: the name file stands twice"},
         {"\"up", "character 1: the word has no closing \""},
         {"-p 'help", "character 4: the help text has no closing '"},
-        {"-p 'a' 'b'", "character 8: expected a -switch, a \"word\" or an <argument>"},
         {"[-p 'a'] 'b'", "character 10: a second help text"},
         {"[<a>] <b>", "character 7: the required <b> stands behind an optional one"},
         {"<a>... [<b>]", "character 9: no argument can follow the list before <b>"},
         {"-p 'a, b'", "character 6: the characters comma and colon cannot stand in a format"},
-        {"-p:q", "character 3: the characters comma and colon cannot stand in a format"},
     };
-    for (const Case& row : cases) {
-        const std::string expected = std::string("the argument format is malformed at ") + row.error;
-        EXPECT_EQ(HkCmdArgs::checkFormat(row.format), expected.c_str()) << row.format;
-        EXPECT_THAT(parse(row.format, "cmd -p 1"), ElementsAre("! " + expected)) << row.format;
-        EXPECT_EQ(HkCmdArgs::help("cmd", row.format), "usage: cmd\n") << row.format;
+    for (const auto& [format, error] : cases) {
+        const std::string expected = std::string("the argument format is malformed at ") + error;
+        EXPECT_EQ(HkCmdArgs::checkFormat(format), expected.c_str()) << format;
+        EXPECT_THAT(parse(format, "cmd -p 1"), ElementsAre("! " + expected)) << format;
+        EXPECT_EQ(HkCmdArgs::help("cmd", format), "usage: cmd\n") << format;
     }
-    EXPECT_TRUE(HkCmdArgs::checkFormat(program).IsEmpty());
-    EXPECT_TRUE(HkCmdArgs::checkFormat("").IsEmpty());
-    EXPECT_TRUE(HkCmdArgs::checkFormat(" \t -a|\n-b\r\n[ -c [ < n = int 1.. > ] ] ").IsEmpty());
+    for (const char* const format : {program, "", " \t -a|\n-b\r\n[ -c [ < n = int 1.. > ] ] "}) {
+        EXPECT_TRUE(HkCmdArgs::checkFormat(format).IsEmpty()) << format;
+    }
 }
 
 TEST(HkCmdArgs, ValuesAtTheEdgesOfTheirTypes) {
-    struct Case {
-        const char* format;
-        const char* value;
-        bool fits;
+    const std::tuple<const char*, Lines, Lines> cases[] = {
+        {"<n=int>",
+         {"-9223372036854775808", "0x7FFFFFFFFFFFFFFF", "+1"},
+         {"-9223372036854775809", "9223372036854775808", "0x", "-", " 1", "1 "}},
+        {"<n=int ..-2>", {"-2"}, {"-1"}},
+        {"<n=int 3>", {"3"}, {"4"}},
+        {"<n=hex 8>", {"0x0123abCD"}, {"123abCD"}},
+        {"<n=hex>", {"0123456789abcdef0123456789ABCDEF"}, {"12g", "0x"}},
+        {"<n=text 2..>", {"ab"}, {"a"}},
+        {"<n=a|b|>", {"B"}, {"", "c"}},
+        {"<n=group a|b c* d>", {" A  d  c:x:y d"}, {"", "c:x", "a c", "a d:"}},
     };
-    const Case cases[] = {
-        {"<n=int>", "-9223372036854775808", true},
-        {"<n=int>", "-9223372036854775809", false},
-        {"<n=int>", "0x7FFFFFFFFFFFFFFF", true},
-        {"<n=int>", "9223372036854775808", false},
-        {"<n=int>", "+1", true},
-        {"<n=int>", "0x", false},
-        {"<n=int>", "-", false},
-        {"<n=int>", " 1", false},
-        {"<n=int>", "1 ", false},
-        {"<n=int ..-2>", "-2", true},
-        {"<n=int ..-2>", "-1", false},
-        {"<n=int 3>", "3", true},
-        {"<n=int 3>", "4", false},
-        {"<n=hex 8>", "0x0123abCD", true},
-        {"<n=hex 8>", "123abCD", false},
-        {"<n=hex>", "0123456789abcdef0123456789ABCDEF", true},
-        {"<n=hex>", "12g", false},
-        {"<n=hex>", "0x", false},
-        {"<n=text 2..>", "a", false},
-        {"<n=a|b|>", "B", true},
-        {"<n=a|b>", "", false},
-        {"<n=group a|b c* d>", " A  d  c:x:y d", true},
-        {"<n=group a|b c* d>", "", false},
-        {"<n=group a|b c* d>", "c:x", false},
-        {"<n=group a|b c* d>", "a c", false},
-        {"<n=group a|b c* d>", "a d:", false},
-    };
-    for (const Case& row : cases) {
-        const char* const argv[] = {"cmd", "--", row.value};
-        const HkCmdArgs args(3, argv, row.format, nullptr, HkCmdArgs::Quiet);
-        EXPECT_EQ(args.iserror() == 0, row.fits) << row.format << " " << row.value;
+    for (const auto& [format, fitting, unfit] : cases) {
+        for (const Lines* const values : {&fitting, &unfit}) {
+            for (const std::string& value : *values) {
+                const char* const argv[] = {"cmd", "--", value.c_str()};
+                const HkCmdArgs args(3, argv, format, nullptr, HkCmdArgs::Quiet);
+                EXPECT_EQ(args.iserror() == 0, values == &fitting) << format << " " << value;
+            }
+        }
     }
 }
 
@@ -144,14 +114,11 @@ TEST(HkCmdArgs, ReadsTypedValues) {
     EXPECT_STREQ(args.text("-x"), "exo");
     EXPECT_THAT(args.list("-n"), ElementsAre("-2", "0x10", "abc"));
     for (const char* const absent : {"file", "-none", "", static_cast<const char*>(nullptr)}) {
-        EXPECT_FALSE(args.isGiven(absent));
         EXPECT_EQ(args.text(absent), nullptr);
         EXPECT_STREQ(args.text(absent, 0, "else"), "else");
         EXPECT_EQ(args.hex(absent, 0, 5), 5U);
         EXPECT_TRUE(args.groupLeader(absent).IsEmpty());
     }
-    EXPECT_EQ(args.text("-n", 3), nullptr);
-    EXPECT_EQ(args.text("-n", -1), nullptr);
     EXPECT_FALSE(args.groupHas("-n", "abc"));
 }
 
@@ -180,8 +147,7 @@ TEST(HkCmdArgs, FlagsAndCallback) {
     const MessageRecorder recorder;
     calls = 0;
     const char* const argv[] = {"cmd", "-pos", "1"};
-    EXPECT_EQ(HkCmdArgs(3, argv, "-position <int>", &countCall, 0).iserror(), 0);
-    EXPECT_EQ(calls, 0);
+    EXPECT_EQ(HkCmdArgs(3, argv, "-position <int>", &countCall, 0).iserror() + calls, 0);
     EXPECT_NE(HkCmdArgs(3, argv, "-position <int>", &countCall, HkCmdArgs::NoAbbreviation | HkCmdArgs::Quiet).iserror(),
               0);
     EXPECT_EQ(calls, 1);
@@ -193,24 +159,16 @@ TEST(HkCmdArgs, FlagsAndCallback) {
 TEST(HkCmdArgs, BadCallsAreErrors) {
     const char* const holes[] = {"cmd", nullptr, "-p", nullptr, "2"};
     const char* const noCommand[] = {nullptr, "-p"};
-    struct Case {
-        int argc;
-        const char* const* argv;
-        const char* format;
-        Lines errors;
-    };
-    const Case cases[] = {
-        {0, holes, "-p <int>", {"! there is no command word"}},
+    const std::tuple<int, const char* const*, const char*, Lines> cases[] = {
         {-5, holes, "-p <int>", {"! there is no command word"}},
         {5, nullptr, "-p <int>", {"! there is no command word"}},
         {2, noCommand, "-p <int>", {"! there is no command word"}},
         {5, holes, nullptr, {"! there is no argument format"}},
         {5, holes, "-p <int>", {"! argument 1 is null", "! argument 3 is null"}},
     };
-    for (const Case& row : cases) {
-        const HkCmdArgs args(row.argc, row.argv, row.format, nullptr, HkCmdArgs::Quiet);
-        EXPECT_NE(args.iserror(), 0);
-        EXPECT_EQ(dump(args, row.format), row.errors);
+    for (const auto& [argc, argv, format, errors] : cases) {
+        const HkCmdArgs args(argc, argv, format, nullptr, HkCmdArgs::Quiet);
+        EXPECT_EQ(dump(args, format), errors);
         EXPECT_THAT(args.usage().c_str(), HasSubstr("usage: "));
     }
     EXPECT_TRUE(HkCmdArgs::complete(1, holes, program).empty());
@@ -232,26 +190,20 @@ TEST(HkCmdArgs, ManyErrorsAreCutAndLongTokensShortened) {
                 ElementsAre(HasSubstr("aaa...\""), "! -p is missing"));
 }
 
-TEST(HkCmdArgs, HundredThousandValuesAndSwitches) {
+TEST(HkCmdArgs, HundredThousandSwitchesAndFormatsBeyondTheCache) {
     Lines words{"cmd"};
     for (int i = 0; i < 50000; ++i) {
-        words.insert(words.end(), {"-p", std::to_string(i), "-name", std::string(3, 'n')});
+        words.insert(words.end(), {"-p", std::to_string(i), "-name", "nnn"});
     }
     const int count = static_cast<int>(words.size());
     const HkCmdArgs args(count, pointersTo(words).data(), "(-p <int>)... (-name <text>)...", nullptr, 0);
-    ASSERT_EQ(args.iserror(), 0);
-    EXPECT_EQ(args.count("-p"), 50000);
     EXPECT_EQ(args.integer("-p", 49999), 49999);
     EXPECT_THAT(args.order(), SizeIs(100000));
-}
-
-TEST(HkCmdArgs, FormatsBeyondTheCacheStillParse) {
     for (int i = 0; i < 600; ++i) {
         const std::string name = "-switch" + std::to_string(i);
         ASSERT_THAT(parse(name.c_str(), "cmd " + name), ElementsAre(name));
     }
-    const std::string giant = "-p '" + std::string(1 << 20, 'h') + "'";
-    EXPECT_THAT(parse(giant.c_str(), "cmd -p"), ElementsAre("-p"));
+    EXPECT_THAT(parse(("-p '" + std::string(1 << 20, 'h') + "'").c_str(), "cmd -p"), ElementsAre("-p"));
 }
 
 TEST(HkCmdArgs, HelpSaysWhatEachArgumentIs) {
@@ -276,57 +228,42 @@ TEST(HkCmdArgs, HelpSaysWhatEachArgumentIs) {
 }
 
 TEST(HkCmdArgs, CompletesWhatMayComeNext) {
-    struct Case {
-        const char* line;
-        const char* partial;
-        Lines words;
+    const char* const words = "[\"all\"] [<on|off>]";
+    const std::tuple<const char*, const char*, const char*, Lines> cases[] = {
+        {program, "program", "-", {"-p", "-position", "-e", "-erase", "-format", "-ver", "-fast", "-slow"}},
+        {program, "program", "-F", {"-format", "-fast"}},
+        {program, "program -e -fast", "", {"-p", "-position", "-format", "-ver"}},
+        {program, "program -p", "", {}},
+        {program, "program -format", "E", {"exo"}},
+        {program, "program", "-format=t", {"-format=tek"}},
+        {program, "program", "-x=t", {}},
+        {program, "program -ver 0 -ver", "", {"0", "1"}},
+        {program, "program --", "-", {}},
+        {words, "cmd", "o", {"on", "off"}},
+        {words, "cmd on", "", {"all"}},
     };
-    const Case cases[] = {
-        {"program", "-", {"-p", "-position", "-e", "-erase", "-format", "-ver", "-fast", "-slow"}},
-        {"program", "-F", {"-format", "-fast"}},
-        {"program -e -fast", "", {"-p", "-position", "-format", "-ver"}},
-        {"program -p 1", "-e", {"-e", "-erase"}},
-        {"program -p", "", {}},
-        {"program -format", "", {"mcs", "exo", "tek"}},
-        {"program -format", "E", {"exo"}},
-        {"program", "-format=t", {"-format=tek"}},
-        {"program", "-x=t", {}},
-        {"program -ver 0 -ver", "", {"0", "1"}},
-        {"program --", "-", {}},
-    };
-    for (const Case& row : cases) {
-        EXPECT_EQ(completions(program, row.line, row.partial), row.words) << row.line << " " << row.partial;
+    for (const auto& [format, line, partial, expected] : cases) {
+        EXPECT_EQ(completions(format, line, partial), expected) << line << " " << partial;
     }
-    EXPECT_EQ(completions("[\"all\"] [<on|off>]", "cmd", "o"), (Lines{"on", "off"}));
-    EXPECT_EQ(completions("[\"all\"] [<on|off>]", "cmd on", ""), (Lines{"all"}));
 }
 
 TEST(HkCmdArgs, DescribesTheArgumentsOfAFormat) {
     const std::vector<HkCmdArgInfo> infos = HkCmdArgs::describe(program);
     ASSERT_THAT(infos, SizeIs(7));
     EXPECT_THAT(infos[0].names, ElementsAre("-p", "-position"));
-    EXPECT_TRUE(infos[0].required && infos[0].list && !infos[0].repeated);
+    EXPECT_TRUE(infos[0].required && infos[0].list && !infos[0].repeated && infos[3].repeated);
     EXPECT_EQ(infos[0].expected, "an integer from 1 to 255");
     EXPECT_THAT(infos[2].choices, ElementsAre("mcs", "exo", "tek"));
-    EXPECT_EQ(infos[3].type, HkCmdArgInfo::Type::Group);
-    EXPECT_TRUE(infos[3].repeated);
-    EXPECT_EQ(infos[6].kind, HkCmdArgInfo::Kind::Positional);
     EXPECT_EQ(infos[6].help, "the device's image");
 }
 
 TEST(HkCmdArgs, NearestWordIsWithinAThird) {
-    struct Case {
-        const char* word;
-        const char* nearest;
-    };
-    const Case cases[] = {
-        {"program", "program"}, {"PRGORAM", "program"}, {"progam", "program"}, {"prog", nullptr},
-        {"verfiy", "verify"},   {"erify", "verify"},    {"xyz", nullptr},      {"er", nullptr},
-        {"", nullptr},          {nullptr, nullptr},     {"erasse", "erase"},
-    };
+    const std::pair<const char*, const char*> cases[] = {
+        {"PRGORAM", "program"}, {"prog", nullptr}, {"verfiy", "verify"}, {"erify", "verify"},
+        {"xyz", nullptr},       {"er", nullptr},   {"", nullptr},        {nullptr, nullptr}};
     const std::vector<HkString> words{"program", "verify", "erase", ""};
-    for (const Case& row : cases) {
-        EXPECT_STREQ(HkCmdArgs::nearest(row.word, words), row.nearest) << (row.word != nullptr ? row.word : "null");
+    for (const auto& [word, nearest] : cases) {
+        EXPECT_STREQ(HkCmdArgs::nearest(word, words), nearest) << (word != nullptr ? word : "null");
     }
 }
 

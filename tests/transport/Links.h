@@ -74,13 +74,6 @@ public:
     void closeClientEnd() override { m_client->deinitialize(); }
     const char* receiveFailure() const override { return " recv() failed: "; }
 
-protected:
-    void release() {
-        closeServerEnd();
-        m_server.reset();
-        m_client.reset();
-    }
-
 private:
     std::unique_ptr<TessalSocket> m_server;
     std::unique_ptr<TessalSocket> m_client;
@@ -155,15 +148,18 @@ private:
     bool m_closed = false;
 };
 
-class ByteByByteLink : public SocketLink {
-public:
-    ByteByByteLink() { platform::replaceSocketHost(&m_host); }
-    ~ByteByByteLink() override {
-        release();  // while the host of its sockets is in place
-        platform::replaceSocketHost(nullptr);
-    }
-    bool isConcurrent() const override { return false; }
+/// A host that the sockets of this process use while it lives.
+template <class Host>
+struct HostInPlace {
+    HostInPlace() { platform::replaceSocketHost(&host); }
+    ~HostInPlace() { platform::replaceSocketHost(nullptr); }
+    HostInPlace(const HostInPlace&) = delete;
+    HostInPlace& operator=(const HostInPlace&) = delete;
 
-private:
-    ByteByByteHost m_host;
+    Host host;
+};
+
+class ByteByByteLink : private HostInPlace<ByteByByteHost>, public SocketLink {
+public:
+    bool isConcurrent() const override { return false; }
 };

@@ -37,18 +37,24 @@ TEST(DataBuffer, FieldsHaveTheWireForm) {
 TEST(DataBuffer, OneCursorServesWritingAndReading) {
     DataBuffer buffer(16);
     buffer.writeInt(std::numeric_limits<int>::min());
-    buffer.writeByte('\xFF');
-    buffer.writeByte('\xFE');
+    buffer.write("\xFF\xFE", 2);
+    const DataBuffer copy(buffer);
+    DataBuffer assigned(1);
+    assigned = copy;
+    assigned = *&assigned;
     buffer.reset();
-    EXPECT_EQ(buffer.getLength(), 0);
-    EXPECT_EQ(buffer.readInt(), std::numeric_limits<int>::min());
-    EXPECT_TRUE(buffer.readBool());
-    EXPECT_FALSE(buffer.readBool());
-    EXPECT_EQ(buffer.getLength(), 6);
+    buffer.write("xxxxxx", 6);
+    EXPECT_EQ(assigned.getLength(), 6);
+    assigned.reset();
+    EXPECT_EQ(assigned.getLength(), 0);
+    EXPECT_EQ(assigned.readInt(), std::numeric_limits<int>::min());
+    EXPECT_TRUE(assigned.readBool());
+    EXPECT_FALSE(assigned.readBool());
+    EXPECT_EQ(assigned.getLength(), 6);
 }
 
 TEST(DataBuffer, GrowsByTheFieldAndAMargin) {
-    MessageRecorder messages;
+    const MessageRecorder messages;
     DataBuffer buffer(16);
     buffer.write("0123456789abcd", 12);
     buffer.writeInt(1);
@@ -56,46 +62,23 @@ TEST(DataBuffer, GrowsByTheFieldAndAMargin) {
     buffer.reset();
     buffer.write("0123456789abcd", 14);
     buffer.writeInt(2);
-    EXPECT_THAT(messages.debug(), ElementsAre("New buffer size = 1044. Requested size = 18.\n"));
     EXPECT_EQ(bytes(buffer).substr(0, 14), "0123456789abcd");
-    messages.clear();
     DataBuffer empty(0);
     empty.writeString(std::string(1030, 'x').c_str());
-    EXPECT_THAT(messages.debug(), ElementsAre("New buffer size = 1028. Requested size = 4.\n",
+    EXPECT_THAT(messages.debug(), ElementsAre("New buffer size = 1044. Requested size = 18.\n",
+                                              "New buffer size = 1028. Requested size = 4.\n",
                                               "New buffer size = 3082. Requested size = 1034.\n"));
-    empty.writeBool(true);
-    EXPECT_EQ(empty.getLength(), 1035);
 }
 
 TEST(DataBuffer, WhatDoesNotFitIsDroppedAndReadingStopsAtTheEnd) {
     MessageRecorder messages;
     DataBuffer buffer(-3);
-    EXPECT_EQ(buffer.readInt(), 0);
-    EXPECT_FALSE(buffer.readBool());
-    EXPECT_EQ(buffer.readByte(), 0);
-    EXPECT_EQ(buffer.getLength(), 0);
-    const char byte = 'x';
+    EXPECT_EQ(buffer.readInt() + buffer.readByte() + buffer.getLength(), 0);
     buffer.writeByte('a');
     messages.clear();
-    buffer.write(&byte, std::numeric_limits<int>::max());
+    buffer.write("x", std::numeric_limits<int>::max());
     EXPECT_THAT(messages.debug(), ElementsAre("Error reallocating space in DataBuffer.\n"));
     EXPECT_EQ(bytes(buffer), "a");
-}
-
-TEST(DataBuffer, CopiesAreIndependent) {
-    DataBuffer buffer(8);
-    buffer.writeInt(5);
-    DataBuffer copy(buffer);
-    DataBuffer assigned(1);
-    assigned = buffer;
-    assigned = *&assigned;
-    buffer.reset();
-    buffer.writeInt(6);
-    for (DataBuffer* other : {&copy, &assigned}) {
-        EXPECT_EQ(other->getLength(), 4);
-        other->reset();
-        EXPECT_EQ(other->readInt(), 5);
-    }
 }
 
 TEST(DataBuffer, ItsOwnBytesCanBeWrittenAgain) {

@@ -37,60 +37,37 @@ TYPED_TEST_SUITE(Transport, Links);
 TYPED_TEST(Transport, FieldsAreTheSameBytesEverywhere) {
     TessalPortMux& client = this->link.client;
     EXPECT_EQ(client.writeInt(0x01020304), 4);
-    EXPECT_EQ(client.writeInt(-2), 4);
     EXPECT_TRUE(client.writeBool(true));
     EXPECT_TRUE(client.writeBool(false));
     EXPECT_EQ(client.writeString("ab"), 2);
     EXPECT_EQ(client.writeString(nullptr), 0);
-    EXPECT_EQ(client.writeString(""), 0);
     EXPECT_TRUE(client.writeSocket("raw", 3));
-    EXPECT_EQ(this->arrived(27), "\4\3\2\1\xFE\xFF\xFF\xFF\1\0\2\0\0\0ab\0\0\0\0\0\0\0\0raw"s);
+    DataBuffer inMemory(4);
+    inMemory.writeInt(-2);
+    inMemory.writeString("text");
+    EXPECT_TRUE(client.writeSocket(inMemory.getBuffer(), inMemory.getLength()));
+    EXPECT_EQ(this->arrived(31), "\4\3\2\1\1\0\2\0\0\0ab\0\0\0\0raw\xFE\xFF\xFF\xFF\4\0\0\0text"s);
 }
 
 TYPED_TEST(Transport, FieldsComeBackAsTheyWent) {
-    const std::vector<int> numbers = {
-        0, 1, -1, 255, 1 << 30, std::numeric_limits<int>::max(), std::numeric_limits<int>::min()};
-    for (const int number : numbers) {
+    for (const int number : {0, -1, 255, std::numeric_limits<int>::max(), std::numeric_limits<int>::min()}) {
         this->link.server.writeInt(number);
         int back = 7;
         EXPECT_EQ(this->link.client.readInt(&back), 4);
         EXPECT_EQ(back, number);
     }
     this->link.server.write("\x03\x02", 2);
-    bool value = false;
-    EXPECT_TRUE(this->link.client.readBool(&value));
-    EXPECT_TRUE(value);
-    EXPECT_TRUE(this->link.client.readBool(&value));
-    EXPECT_FALSE(value);
-}
-
-TYPED_TEST(Transport, AMessageLaidOutInMemoryReadsLikeItsFields) {
-    DataBuffer buffer(4);
-    buffer.writeInt(42);
-    buffer.writeString("text");
-    buffer.writeBool(true);
-    EXPECT_TRUE(this->link.client.writeSocket(buffer.getBuffer(), buffer.getLength()));
-    int number = 0;
-    this->link.server.readInt(&number);
-    EXPECT_EQ(number, 42);
-    this->link.server.readInt(&number);
-    EXPECT_EQ(this->arrived(static_cast<std::size_t>(number)), "text");
-    bool flag = false;
-    EXPECT_TRUE(this->link.server.readBool(&flag));
-    EXPECT_TRUE(flag);
-}
-
-TYPED_TEST(Transport, NothingToMoveSucceedsWithoutACall) {
-    this->link.closeServerEnd();
-    EXPECT_TRUE(this->link.client.read(nullptr, 0));
-    EXPECT_TRUE(this->link.client.write(nullptr, -1));
-    EXPECT_TRUE(this->link.client.readSocket(nullptr, -5));
+    for (const bool expected : {true, false}) {
+        bool value = !expected;
+        EXPECT_TRUE(this->link.client.readBool(&value));
+        EXPECT_EQ(value, expected);
+    }
 }
 
 TYPED_TEST(Transport, BlocksOfAnySizePassWhole) {
     std::string sent(std::size_t{3} << 20, '\0');
     for (std::size_t i = 0; i < sent.size(); ++i) {
-        sent[i] = static_cast<char>(i * 31 + i / 4096);
+        sent[i] = static_cast<char>(1 + (i * 31 + i / 4096) % 255);
     }
     const int length = static_cast<int>(sent.size());
     if (!this->link.isConcurrent()) {
@@ -100,39 +77,32 @@ TYPED_TEST(Transport, BlocksOfAnySizePassWhole) {
     }
     // Both directions at once: neither end's buffers hold what the other sends.
     std::string back(sent.size(), '?');
+    int announced = 0;
     std::thread echo([&] {
         std::string block(sent.size(), '?');
         EXPECT_TRUE(this->link.server.read(block.data(), length));
-        EXPECT_TRUE(this->link.server.write(block.data(), length));
+        EXPECT_EQ(this->link.server.writeString(block.c_str()), length);
     });
     EXPECT_TRUE(this->link.client.write(sent.data(), length));
+    this->link.client.readInt(&announced);
+    EXPECT_EQ(announced, length);
     EXPECT_TRUE(this->link.client.read(back.data(), length));
     echo.join();
     EXPECT_EQ(back, sent);
-    std::thread longText([&] { EXPECT_EQ(this->link.server.writeString(std::string(20000, 'x').c_str()), 20000); });
-    int announced = 0;
-    this->link.client.readInt(&announced);
-    EXPECT_EQ(announced, 20000);
-    std::string text(20000, '?');
-    EXPECT_TRUE(this->link.client.read(text.data(), announced));
-    longText.join();
-    EXPECT_EQ(text, std::string(20000, 'x'));
 }
 
 TYPED_TEST(Transport, APeerThatHasClosedIsAFailureAtOnce) {
     this->link.server.write("\1\2", 2);
     this->link.closeServerEnd();
+    EXPECT_TRUE(this->link.client.read(nullptr, 0) && this->link.client.write(nullptr, -1)) << "nothing to move";
     const MessageRecorder messages;
     int value = 99;
     EXPECT_EQ(this->link.client.readInt(&value), 4);
     bool flag = true;
     EXPECT_FALSE(this->link.client.readBool(&flag));
     EXPECT_TRUE(flag) << "left alone";
-    ASSERT_EQ(messages.status().size(), 2U);
-    for (const std::string& message : messages.status()) {
-        EXPECT_EQ(message.compare(0, std::string(this->link.receiveFailure()).size(), this->link.receiveFailure()), 0)
-            << message;
-    }
+    const auto failure = testing::StartsWith(this->link.receiveFailure());
+    EXPECT_THAT(messages.status(), testing::ElementsAre(failure, failure));
     char block[1024] = {};
     bool sent = true;
     for (int attempt = 0; sent && attempt < 100; ++attempt) {
@@ -146,14 +116,8 @@ TYPED_TEST(Transport, APeerThatHasClosedIsAFailureAtOnce) {
 TEST(PortMux, TheSelectionDecidesAndAMissingTransportFails) {
     TessalPortMux mux(true);
     char byte = 0;
-    EXPECT_FALSE(mux.read(&byte, 1));
-    EXPECT_FALSE(mux.writeBool(true));
-    EXPECT_EQ(mux.writeInt(1), 0);
+    EXPECT_FALSE(mux.read(&byte, 1) || mux.writeBool(true) || mux.writeInt(1) != 0);
     mux.setClientSocketFd(5);
-
-    SocketLink socket;
-    PipeLink pipe;
-    ASSERT_TRUE(socket.connect() && pipe.connect());
     TessalSocket stored(0, "", 1);
     mux.setSocketHandle(&stored);
     mux.setClientSocketFd(77);

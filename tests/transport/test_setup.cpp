@@ -14,39 +14,24 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::StartsWith;
 
-TEST(SocketSetup, APortInUseIsRefused) {
+TEST(SocketSetup, APortInUseIsRefusedAndAServerThatIsNotUpIsToldOnce) {
     int port = 0;
     const std::unique_ptr<TessalSocket> server = listeningServer(port);
     ASSERT_NE(server, nullptr);
     const MessageRecorder messages;
-    TessalSocket second(0, nullptr, port);
-    EXPECT_FALSE(second.initialize());
-    EXPECT_THAT(messages.status(), ElementsAre(StartsWith(" bind() failed: ")));
-}
-
-TEST(SocketSetup, AServerThatIsNotUpIsToldOnce) {
-    const MessageRecorder messages;
+    EXPECT_FALSE(TessalSocket(0, nullptr, port).initialize());
     TessalSocket client(1, "127.0.0.1", 1);
-    EXPECT_FALSE(client.initialize());
-    EXPECT_THAT(messages.all(), IsEmpty());
+    EXPECT_FALSE(client.initialize()) << "without a message";
     EXPECT_FALSE(client.connectToServer());
-    EXPECT_THAT(messages.status(), ElementsAre(StartsWith(" connect() failed: ")));
+    EXPECT_THAT(messages.status(), ElementsAre(StartsWith(" bind() failed: "), StartsWith(" connect() failed: ")));
     EXPECT_NE(client.getClientSocketFd(), TessalSocket::noSocket) << "the socket of the last attempt";
-    EXPECT_TRUE(client.deinitialize());
-    EXPECT_EQ(client.getClientSocketFd(), TessalSocket::noSocket);
 }
 
 /// A host whose calls fail from the n-th on.
 class FailingHost : public ByteByByteHost {
 public:
-    bool startFails = false;
-    bool openFails = false;
-    bool resolveFails = false;
-    bool closeFails = false;
-    int connectsBeforeSuccess = 0;
-    int attempts = 0;
-    int pauses = 0;
-    int started = 0;
+    bool startFails = false, openFails = false, resolveFails = false, closeFails = false;
+    int connectsBeforeSuccess = 0, attempts = 0, pauses = 0, started = 0;
 
     bool start() override {
         started += startFails ? 0 : 1;
@@ -63,50 +48,42 @@ public:
     void pause(int milliseconds) override { pauses += milliseconds; }
 };
 
-class ScriptedSocket : public testing::Test {
+class ScriptedSocket : public testing::Test, HostInPlace<FailingHost> {
 protected:
-    ScriptedSocket() { platform::replaceSocketHost(&host); }
-    ~ScriptedSocket() override {
-        client.reset();
-        platform::replaceSocketHost(nullptr);
-    }
-
-    FailingHost host;
-    std::unique_ptr<TessalSocket> client = std::make_unique<TessalSocket>(1, "server", 5);
+    FailingHost& failing = host;
     MessageRecorder messages;
+    TessalSocket client{1, "server", 5};
 };
 
 TEST_F(ScriptedSocket, TenAttemptsAreMadeBehindOnePause) {
-    host.connectsBeforeSuccess = 9;
-    EXPECT_TRUE(client->connectToServer());
-    EXPECT_EQ(host.attempts, 10);
-    EXPECT_EQ(host.pauses, 50);
+    failing.connectsBeforeSuccess = 9;
+    EXPECT_TRUE(client.connectToServer());
+    EXPECT_EQ(failing.attempts, 10);
+    EXPECT_EQ(failing.pauses, 50);
     EXPECT_THAT(messages.all(), IsEmpty());
-    host.connectsBeforeSuccess = 100;
-    host.closeFails = true;
-    EXPECT_FALSE(client->connectToServer());
-    EXPECT_EQ(host.attempts, 20);
-    EXPECT_EQ(messages.status().size(), 11U);
-    EXPECT_EQ(messages.status().front(), " closesocket() failed: 104\n");
-    EXPECT_EQ(messages.status().back(), " connect() failed: 104\n");
+    failing.connectsBeforeSuccess = 100;
+    failing.closeFails = true;
+    EXPECT_FALSE(client.connectToServer());
+    EXPECT_EQ(failing.attempts, 20);
+    std::vector<std::string> expected(10, " closesocket() failed: 104\n");
+    expected.emplace_back(" connect() failed: 104\n");
+    EXPECT_EQ(messages.status(), expected);
 }
 
 TEST_F(ScriptedSocket, EachStepThatFailsIsTold) {
-    host.startFails = true;
-    EXPECT_FALSE(client->initialize());
-    host.startFails = false;
-    host.openFails = true;
-    EXPECT_FALSE(client->initialize());
-    host.openFails = false;
-    host.resolveFails = true;
-    EXPECT_FALSE(client->initialize());
+    for (bool* const fault : {&failing.startFails, &failing.openFails, &failing.resolveFails}) {
+        *fault = true;
+        EXPECT_FALSE(client.initialize());
+        *fault = false;
+    }
     EXPECT_THAT(messages.status(), ElementsAre("Failed to load Winsock!\n", " socket() failed: 104\n",
                                                "Unable to resolve server: server\n"));
-    EXPECT_TRUE(client->deinitialize());
-    EXPECT_TRUE(client->deinitialize());
-    EXPECT_EQ(host.started, 0) << "stopped as often as started";
+    EXPECT_TRUE(client.deinitialize());
+    EXPECT_TRUE(client.deinitialize());
+    EXPECT_EQ(failing.started, 0) << "stopped as often as started";
     messages.clear();
-    EXPECT_FALSE(client->connectToServer());
+    failing.resolveFails = true;
+    EXPECT_FALSE(client.connectToServer());
     EXPECT_EQ(messages.status().size(), 11U) << "each of ten attempts, and the end";
 }
 
@@ -129,18 +106,13 @@ TEST(PipeSetup, AClientWithoutServerFailsAtOnce) {
     EXPECT_THAT(messages.debug(), ElementsAre(StartsWith(" Create pipe failed, status = ")));
     EXPECT_FALSE(client.waitForClient());
     messages.clear();
-    EXPECT_FALSE(client.readSocket(nullptr, 1));
     char byte = 0;
-    EXPECT_FALSE(client.readSocket(&byte, 1));
-    EXPECT_FALSE(client.writeSocket(&byte, 1));
+    EXPECT_FALSE(client.readSocket(nullptr, 1) || client.readSocket(&byte, 1) || client.writeSocket(&byte, 1));
     EXPECT_EQ(client.writeString(client.getClientSocketFd(), "abc"), 3);
-    const std::vector<std::string> status = messages.status();
-    ASSERT_EQ(status.size(), 9U);
-    EXPECT_THAT(status[2], StartsWith("ReadFile failed: "));
-    EXPECT_THAT(status[3], StartsWith(" read : "));
-    EXPECT_THAT(status[4], StartsWith("WriteFile failed: "));
-    EXPECT_THAT(status[5], StartsWith(" write : "));
-    EXPECT_EQ(status[8], "TessalSocket::writeString error.\n");
+    const auto notRead = StartsWith("ReadFile failed: "), read = StartsWith(" read : ");
+    const auto notWritten = StartsWith("WriteFile failed: "), write = StartsWith(" write : ");
+    EXPECT_THAT(messages.status(), ElementsAre(notRead, read, notRead, read, notWritten, write, notWritten, notWritten,
+                                               "TessalSocket::writeString error.\n"));
 }
 
 TEST(PipeSetup, ASecondServerLeavesTheFirstAlone) {
@@ -162,19 +134,16 @@ TEST(PipeSetup, ASecondServerLeavesTheFirstAlone) {
     int value = 0;
     first.readInt(first.getClientSocketFd(), &value);
     EXPECT_EQ(value, 5) << "looking for the pipe was no client";
-    EXPECT_TRUE(first.close(nullptr));
-    EXPECT_TRUE(first.close(nullptr));
+    EXPECT_TRUE(first.close(nullptr) && first.close(nullptr));
     TessalPipe third(0, name.c_str());
     EXPECT_TRUE(third.initialize());
     EXPECT_NE(third.getClientSocketFd(), second.getClientSocketFd()) << "the name is free again";
 }
 
 TEST(PipeSetup, NamesThatAreNoneAreRefused) {
-    const std::string names[] = {"", "\\\\.\\pipe\\", std::string(128, 'x'), "\\\\.\\pipe\\" + std::string(120, 'y')};
-    for (const std::string& name : names) {
-        SCOPED_TRACE(name);
-        EXPECT_FALSE(TessalPipe(0, name.c_str()).initialize());
-        EXPECT_FALSE(TessalPipe(1, name.c_str()).initialize());
+    const std::string prefix = "\\\\.\\pipe\\";
+    for (const std::string& name : {std::string(), prefix, std::string(128, 'x'), prefix + std::string(120, 'y')}) {
+        EXPECT_FALSE(TessalPipe(0, name.c_str()).initialize() || TessalPipe(1, name.c_str()).initialize()) << name;
     }
     EXPECT_FALSE(TessalPipe(1, nullptr).initialize());
 }
