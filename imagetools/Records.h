@@ -50,8 +50,27 @@ inline char* putData(char* to, const unsigned char* data, std::size_t size, unsi
     return to;
 }
 
+/// The same for a whole row, in steps that compilers turn into vector instructions.
+inline char* putWholeRow(char* to, const unsigned char* data, unsigned& sum) {
+    unsigned char digits[2 * rowSize];
+    unsigned rowSum = 0;
+    for (std::size_t i = 0; i < rowSize; ++i) {
+        digits[2 * i] = data[i] >> 4;
+        digits[2 * i + 1] = data[i] & 0xFU;
+        rowSum += data[i];
+    }
+    for (unsigned char& digit : digits) {
+        constexpr unsigned char toDigit = '0';
+        constexpr unsigned char toLetter = 'A' - 10;
+        digit = static_cast<unsigned char>(digit + (digit < 10 ? toDigit : toLetter));
+    }
+    std::memcpy(to, digits, sizeof digits);
+    sum += rowSum;
+    return to + sizeof digits;
+}
+
 inline char* putRow(char* to, const Segment& row, unsigned& sum) {
-    return row.size == rowSize ? putData(to, row.data, rowSize, sum) : putData(to, row.data, row.size, sum);
+    return row.size == rowSize ? putWholeRow(to, row.data, sum) : putData(to, row.data, row.size, sum);
 }
 
 }  // namespace ImageTools

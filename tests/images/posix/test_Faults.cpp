@@ -45,7 +45,7 @@ TEST(Faults, AFullDiskLeavesTheOldFilesAndNoHalfOnes) {
     for (const char* const format : {"mcs", "exo", "tek", "hex", "bin"}) {
         const std::string file = std::string("p_1.") + format;
         bench.write(file, "old");
-        for (const rlim_t room : {0, 1, 4096, 90000}) {
+        for (const rlim_t room : std::initializer_list<rlim_t>{0, 1, 4096, 90000}) {
             const FullDisk disk(room);
             EXPECT_FALSE(bench.generate(std::string("-size 128 1M -output p -data @a -format ") + format)) << room;
             EXPECT_THAT(bench.said(), testing::HasSubstr("cannot be written: File too large")) << room;
