@@ -132,8 +132,6 @@ const char* IF_IMAGEGEN::getcmdformat() {
 
 IF_IMAGEGEN::IF_IMAGEGEN(const HkCmdArgs* command) : m_command(command) {}
 
-IF_IMAGEGEN::~IF_IMAGEGEN() = default;
-
 unsigned char IF_IMAGEGEN::makeprom() {
     Run run;
     Problem problem = argumentProblem(m_command);

@@ -38,8 +38,6 @@ M2IUtil_Data_Utils::M2IUtil_Data_Utils(const char* path, DataDumpType dumpType, 
     }
 }
 
-M2IUtil_Data_Utils::~M2IUtil_Data_Utils() = default;
-
 void M2IUtil_Data_Utils::GetProgramSectionAddressRange(unsigned int* lowest, unsigned int* highest) const {
     if (lowest != nullptr) {
         *lowest = m_lowest;

@@ -21,7 +21,7 @@ public:
 
     /// @param command the parsed command, which outlives the generator
     explicit IF_IMAGEGEN(const HkCmdArgs* command);
-    ~IF_IMAGEGEN();
+    ~IF_IMAGEGEN() = default;
     IF_IMAGEGEN(const IF_IMAGEGEN&) = delete;
     IF_IMAGEGEN& operator=(const IF_IMAGEGEN&) = delete;
 

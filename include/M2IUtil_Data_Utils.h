@@ -33,7 +33,7 @@ class TESSAL_API M2IUtil_Data_Utils {
 public:
     /// @param result receives 0 on success, any other value on failure; may be null
     M2IUtil_Data_Utils(const char* path, DataDumpType dumpType, M2IUtil_BramMapping::M2IUtil_Results* result);
-    ~M2IUtil_Data_Utils();
+    ~M2IUtil_Data_Utils() = default;
     M2IUtil_Data_Utils(const M2IUtil_Data_Utils&) = delete;
     M2IUtil_Data_Utils& operator=(const M2IUtil_Data_Utils&) = delete;
 
