@@ -75,7 +75,7 @@ const char* problemOfKind(fs::file_type type) {
 
 }  // namespace
 
-const char* readFile(const fs::path& path, FileText& result) {
+const char* readBytes(const fs::path& path, FileText& result) {
     std::error_code error;
     if (const char* const problem = problemOfKind(fs::status(path, error).type())) {
         return problem;
@@ -91,6 +91,15 @@ const char* readFile(const fs::path& path, FileText& result) {
     FileText text;
     text.name = path.u8string();
     if (const char* const problem = readAll(stream, error ? 0 : static_cast<std::size_t>(size), text)) {
+        return problem;
+    }
+    result = std::move(text);
+    return nullptr;
+}
+
+const char* readFile(const fs::path& path, FileText& result) {
+    FileText text;
+    if (const char* const problem = readBytes(path, text)) {
         return problem;
     }
     if (isBinary(text)) {

@@ -17,7 +17,11 @@ struct FileText {
     std::string name;  ///< the path in UTF-8, for messages
 };
 
-/// Reads a whole file. Gives null, or what is wrong with it: a constant text such as "is a directory".
+/// Reads a whole file of at most 1 GiB, whatever is in it; pipes and devices are not opened. Gives null, or what is
+/// wrong with it: a constant text such as "is a directory".
+const char* readBytes(const std::filesystem::path& path, FileText& result);
+
+/// The same for text: a binary file is refused.
 const char* readFile(const std::filesystem::path& path, FileText& result);
 
 /// Reads the first file of this name that can be read. Without one the result is empty and, with @p report, one

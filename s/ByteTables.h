@@ -37,11 +37,12 @@ constexpr std::array<unsigned char, 256> makeMirroredBytes() {
 }
 
 constexpr char hexDigits[] = "0123456789abcdef";
+constexpr char upperHexDigits[] = "0123456789ABCDEF";
 
-constexpr std::array<std::array<char, 2>, 256> makeHexPairs() {
+constexpr std::array<std::array<char, 2>, 256> makeHexPairs(const char* digits) {
     std::array<std::array<char, 2>, 256> table{};
     for (unsigned byte = 0; byte < 256; ++byte) {
-        table[byte] = {hexDigits[byte >> 4], hexDigits[byte & 15U]};
+        table[byte] = {digits[byte >> 4], digits[byte & 15U]};
     }
     return table;
 }
@@ -67,7 +68,9 @@ constexpr std::uint64_t mirrorEachByte(std::uint64_t word) {
     return (word >> 4 & 0x0F0F0F0F0F0F0F0FU) | (word & 0x0F0F0F0F0F0F0F0FU) << 4;
 }
 /// The byte as two hex digits, the high one first.
-inline constexpr auto hexPair = makeHexPairs();
+inline constexpr auto hexPair = makeHexPairs(hexDigits);
+/// The same in upper case.
+inline constexpr auto upperHexPair = makeHexPairs(upperHexDigits);
 /// The byte as eight characters 0 and 1, the least significant bit first.
 inline constexpr auto bitText = makeBitTexts();
 

@@ -6,13 +6,14 @@
 
 #include "HkStr.h"
 #include "ProfileConfig.h"
-#include "ProfileKeyTable.h"
 #include "PromUtility.h"
 #include "TessalException.h"
+#include "deviceprofile/PartTable.h"
 #include "s/PromUtilityOrigin.h"
 
 namespace {
 
+using DeviceProfile::PartTable;
 using DeviceProfile::ProfileConfig;
 using PartList = std::vector<promPartAndSizePair>;
 
@@ -27,22 +28,6 @@ Catalogue& catalogue() {
     static Catalogue& instance = *new Catalogue;
     return instance;
 }
-
-/// The rows of `PROM_DEVICES` in one data file.
-class PartTable {
-public:
-    PartTable(const char* dataFile, ProfileConfig& selection) : m_table(dataFile, &selection, 1, 1, 1) {}
-
-    /// Null past the last row.
-    const char* name(short row) { return cell(row, 0); }
-    /// Null where the row has no size.
-    const char* size(short row) { return cell(row, 1); }
-
-private:
-    const char* cell(short row, short field) { return m_table.getstringbykey("PROM_DEVICES", ":", row, ",", field); }
-
-    ProfileKeyTable m_table;
-};
 
 void readParts(const char* dataFile, ProfileConfig& selection, PartList& parts) {
     PartTable table(dataFile, selection);

@@ -1,0 +1,189 @@
+// What the generator writes, read back by programs that nobody here wrote; what linkers write, read here.
+
+#include <gtest/gtest.h>
+#include <sys/wait.h>
+
+#include <algorithm>
+#include <cstdlib>
+#include <iomanip>
+#include <sstream>
+
+#include "M2IUtil_Data_Utils.h"
+#include "images/Workbench.h"
+
+namespace {
+
+/// Runs a command line in a directory, its output going to the file "out" there; true when it succeeds.
+bool runs(const Workbench& bench, const std::string& command) {
+    const int status = std::system(("cd " + bench.path() + " && ( " + command + " ) > out 2>&1").c_str());
+    return WIFEXITED(status) && WEXITSTATUS(status) == 0;
+}
+
+#define NEEDS(bench, program)                        \
+    if (!runs(bench, "command -v " program)) {       \
+        GTEST_SKIP() << program " is not installed"; \
+    }
+
+struct Layout {
+    const char* name;
+    const char* arguments;  ///< of data files "a", 3 bytes short of 200 KiB, and "b" of 300 bytes
+    std::uint64_t a;
+    std::uint64_t b;
+};
+
+const Layout layouts[] = {
+    {"from 0", "-up 0 -data @a -up 40000 -data @b", 0, 0x40000},
+    {"across 64 KiB", "-up FFF1 -data @a -up FF -data @b", 0xFFF1, 0xFF},
+    {"above 24 bits", "-up 12FF0003 -data @a -up 13123456 -data @b", 0x12FF0003, 0x13123456},
+};
+
+std::string mirrored(std::string text) {
+    for (char& ch : text) {
+        unsigned result = 0;
+        for (unsigned bit = 0; bit < 8; ++bit) {
+            result |= (static_cast<unsigned char>(ch) >> bit & 1U) << (7 - bit);
+        }
+        ch = static_cast<char>(result);
+    }
+    return text;
+}
+
+/// The content of the PROMs from the lowest address up, computed as plainly as can be.
+std::string expectedImage(const std::string& a, std::uint64_t aAt, const std::string& b, std::uint64_t bAt,
+                          std::uint64_t& lowest) {
+    lowest = std::min(aAt, bAt);
+    std::string image(std::max(aAt + a.size(), bAt + b.size()) - lowest, '\xFF');
+    image.replace(aAt - lowest, a.size(), a);
+    image.replace(bAt - lowest, b.size(), b);
+    return image;
+}
+
+struct Format {
+    const char* name;
+    const char* reader;  ///< srec_cat's word for it
+    const char* target;  ///< objcopy's word for it; null where it has none
+};
+
+const Format formats[] = {
+    {"mcs", "-intel", "ihex"}, {"exo", "-motorola", "srec"}, {"tek", "-tektronix-extended", nullptr}};
+
+TEST(Independent, RecordFilesComeBackAsTheDataTheyWereMadeOf) {
+    Workbench bench;
+    NEEDS(bench, "srec_cat");
+    NEEDS(bench, "objcopy");
+    const std::string a = noise(200 * 1024 - 3);
+    const std::string b = noise(300, 7);
+    bench.write("a", a);
+    bench.write("b", b);
+    for (const Layout& layout : layouts) {
+        for (const Format& format : formats) {
+            for (const bool swapped : {false, true}) {
+                const std::string what = std::string(layout.name) + ' ' + format.name + (swapped ? " swapped" : "");
+                ASSERT_TRUE(bench.generate(std::string("-generic -output p -fillValue FF -format ") + format.name +
+                                           (swapped ? " " : " -disableswap ") + layout.arguments))
+                    << bench.said();
+                std::uint64_t lowest = 0;
+                const std::string image =
+                    expectedImage(swapped ? mirrored(a) : a, layout.a, swapped ? mirrored(b) : b, layout.b, lowest);
+                bench.write("expected", image);
+                const std::string file = std::string("p.") + format.name + ' ' + format.reader;
+                EXPECT_TRUE(runs(bench, "srec_cmp " + file + " expected -binary -offset " + std::to_string(lowest)))
+                    << what << ": " << bench.read("out");
+                if (format.target != nullptr) {
+                    EXPECT_TRUE(runs(bench, std::string("objcopy -I ") + format.target + " -O binary p." + format.name +
+                                                " back && cmp back expected"))
+                        << what << ": " << bench.read("out");
+                }
+            }
+        }
+    }
+}
+
+TEST(Independent, SplitPromsComeBackAsTheWhole) {
+    Workbench bench;
+    NEEDS(bench, "srec_cat");
+    const std::string a = noise(200 * 1024 - 3);
+    bench.write("a", a);
+    for (const Format& format : formats) {
+        ASSERT_TRUE(bench.generate(std::string("-size 64K 100K 64K -disableswap -output p -format ") + format.name +
+                                   " -up 11 -data @a"));
+        std::string whole;
+        for (int i = 0; i < 3; ++i) {
+            const std::string offsets[] = {"0", "0x10000", "0x29000"};
+            whole +=
+                "p_" + std::to_string(i) + '.' + format.name + ' ' + format.reader + " -offset " + offsets[i] + ' ';
+        }
+        EXPECT_TRUE(runs(bench, "srec_cat '(' " + whole + "')' -offset -0x11 -o back -binary && cmp back a"))
+            << format.name << ": " << bench.read("out");
+    }
+}
+
+TEST(Independent, RawFilesComeBackAsTheData) {
+    Workbench bench;
+    NEEDS(bench, "xxd");
+    bench.write("a", noise(70001));
+    ASSERT_TRUE(bench.generate("-generic -disableswap -output p -format hex -up 100 -data @a"));
+    ASSERT_TRUE(bench.generate("-generic -disableswap -output p -format bin -down 20000 -data @a"));
+    EXPECT_TRUE(runs(bench, "xxd -r -p p.hex back && cmp back a")) << bench.read("out");
+    std::string reversed = bench.read("a");
+    std::reverse(reversed.begin(), reversed.end());
+    EXPECT_EQ(bench.read("p.bin"), reversed);
+}
+
+/// Lowest address and end of the loaded parts, as readelf tells them.
+bool rangeByReadelf(const Workbench& bench, std::uint64_t& lowest, std::uint64_t& highest) {
+    if (!runs(bench, "readelf -lW a.elf")) {
+        return false;
+    }
+    lowest = ~std::uint64_t{0};
+    highest = 0;
+    std::istringstream lines(bench.read("out"));
+    std::string line;
+    while (std::getline(lines, line)) {
+        std::istringstream fields(line);
+        std::string type;
+        std::uint64_t offset = 0, virtualAddress = 0, address = 0, size = 0;
+        if (fields >> type && type == "LOAD" &&
+            fields >> std::hex >> std::setbase(0) >> offset >> virtualAddress >> address >> size && size != 0) {
+            lowest = std::min(lowest, address);
+            highest = std::max(highest, address + size);
+        }
+    }
+    return highest != 0;
+}
+
+TEST(Independent, LinkedProgramsHaveTheRangeThatReadelfTells) {
+    Workbench bench;
+    NEEDS(bench, "gcc");
+    NEEDS(bench, "readelf");
+    bench.write("a.c", "int data[100] = {1}; int cleared[1000]; void _start(void) { data[1] = cleared[2]; }\n");
+    bench.write("rom.ld",
+                "SECTIONS { . = 0x8000; .text : { *(.text*) } .ram 0x20000000 : AT(0x9000) { *(.data*) }\n"
+                ".bss (NOLOAD) : { *(.bss*) *(COMMON) } /DISCARD/ : { *(.note*) *(.comment) *(.eh_frame*) } }\n");
+    const char* const builds[] = {
+        "gcc -nostdlib -static -no-pie a.c -o a.elf",
+        "gcc -nostdlib -static -no-pie -Wl,-Ttext=0x100000,-Tdata=0x40000000 a.c -o a.elf",
+        "gcc -nostdlib -static -no-pie -Wl,--build-id=none,-T,rom.ld a.c -o a.elf",
+        "gcc -c a.c -fno-pic -o a.o && objcopy -O elf32-i386 a.o b.o && ld -m elf_i386 -T rom.ld b.o -o a.elf",
+    };
+    int compared = 0;
+    for (const char* const build : builds) {
+        std::uint64_t lowest = 0;
+        std::uint64_t highest = 0;
+        if (!runs(bench, build) || !rangeByReadelf(bench, lowest, highest)) {
+            continue;
+        }
+        ++compared;
+        M2IUtil_BramMapping::M2IUtil_Results result{};
+        const M2IUtil_Data_Utils reader((bench / "a.elf").c_str(), DUMP_BY_DEFAULT, &result);
+        unsigned int first = 0;
+        unsigned int last = 0;
+        reader.GetProgramSectionAddressRange(&first, &last);
+        EXPECT_EQ(result, M2IUtil_BramMapping::M2IUTIL_SUCCESS) << build << ": " << bench.said();
+        EXPECT_EQ(first, lowest) << build;
+        EXPECT_EQ(last, highest) << build;
+    }
+    EXPECT_GE(compared, 3) << bench.read("out");
+}
+
+}  // namespace
