@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # about: unit tests under AddressSanitizer and UndefinedBehaviorSanitizer, build by clang++
 # needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h clang=clang++ libclang-rt-dev
-# limit: 900
+# limit: 1500
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 

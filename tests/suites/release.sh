@@ -1,9 +1,11 @@
 #!/usr/bin/env bash
 # about: unit tests, optimised build by g++
 # needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h
-# limit: 900
+# limit: 1500
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 
+# The locks are tortured for a minute.
+export TESSAL_TORTURE_SECONDS=${TESSAL_TORTURE_SECONDS:-60}
 build release
 run_tests "$root/build/release"
