@@ -6,12 +6,10 @@
 
 #include "HkPath.h"
 #include "HkStr.h"
+#include "s/CableInfoOrigin.h"
 #include "s/RecordStream.h"
-#include "s/UnitOrigin.h"
 
 namespace {
-
-constexpr UnitOrigin origin{"../s/CableInfo", "$Revision: 1.1 $"};
 
 constexpr unsigned int flag4 = 4;
 constexpr unsigned int flag8 = 8;
@@ -173,25 +171,25 @@ HkString CableInfo::displayPortName() {
 }
 
 void CableInfo::dump() {
-    origin.report().issueStatus("------------------------------------------\n");
+    cableInfoOrigin.report().issueStatus("------------------------------------------\n");
     if (!hasText(m_cableName.getString())) {
         return;
     }
     const bool hasPort = hasText(m_portName.getString());
-    origin.report().issueStatus("Cable Name: %s\n", getCableName());
+    cableInfoOrigin.report().issueStatus("Cable Name: %s\n", getCableName());
     if (hasPort) {
-        origin.report().issueStatus("Port Name: %s\n", getPortName());
+        cableInfoOrigin.report().issueStatus("Port Name: %s\n", getPortName());
     }
-    origin.report().issueStatus("Port Number: %d\n", m_portNumber);
-    origin.report().issueStatus("Port Speed: %d\n", m_portSpeed);
-    origin.report().issueStatus("Display Cable Name: %s\n", getDisplayCableName());
-    origin.report().issueStatus("Cable Name w/o space: %s\n", getCableNameWithoutSpace());
+    cableInfoOrigin.report().issueStatus("Port Number: %d\n", m_portNumber);
+    cableInfoOrigin.report().issueStatus("Port Speed: %d\n", m_portSpeed);
+    cableInfoOrigin.report().issueStatus("Display Cable Name: %s\n", getDisplayCableName());
+    cableInfoOrigin.report().issueStatus("Cable Name w/o space: %s\n", getCableNameWithoutSpace());
     const auto shown = [](const char* speed) { return speed != nullptr ? speed : "unknown"; };
     const char* const displaySpeed = getDisplaySpeedString();
-    origin.report().issueStatus("Display Port Speed: %s\n", shown(displaySpeed));
+    cableInfoOrigin.report().issueStatus("Display Port Speed: %s\n", shown(displaySpeed));
     const char* const speedDigits = getSpeedString();
-    origin.report().issueStatus("Port Speed string: %s\n", shown(speedDigits));
+    cableInfoOrigin.report().issueStatus("Port Speed string: %s\n", shown(speedDigits));
     if (hasPort) {
-        origin.report().issueStatus("Display Port Name: %s\n", getDisplayPortName());
+        cableInfoOrigin.report().issueStatus("Display Port Name: %s\n", getDisplayPortName());
     }
 }

@@ -4,11 +4,9 @@
 
 #include "CableInfo.h"
 #include "HkStr.h"
-#include "s/UnitOrigin.h"
+#include "s/CableInfoOrigin.h"
 
 namespace {
-
-constexpr UnitOrigin origin{"../s/CableInfo", "$Revision: 1.1 $"};
 
 struct Speed {
     int hertz;
@@ -45,7 +43,7 @@ const Speed* findSpeed(int hertz, int line = __builtin_LINE()) {
             return &speed;
         }
     }
-    origin.report(line).issueInfo("Invalid speed %d.\n", hertz);
+    cableInfoOrigin.report(line).issueInfo("Invalid speed %d.\n", hertz);
     return nullptr;
 }
 
@@ -87,7 +85,7 @@ PortMatch matchPort(const char* name, int line = __builtin_LINE()) {
             return {&form, place + length};
         }
     }
-    origin.report(line).issueInfo("Invalid Display Port Name %s.\n", name != nullptr ? name : "");
+    cableInfoOrigin.report(line).issueInfo("Invalid Display Port Name %s.\n", name != nullptr ? name : "");
     return {nullptr, nullptr};
 }
 
@@ -117,7 +115,7 @@ int CableInfo::getSpeedNumber(const char* text) {
             return speed.hertz;
         }
     }
-    origin.report().issueStatus("Invalid input speed string %s.\n", text != nullptr ? text : "");
+    cableInfoOrigin.report().issueStatus("Invalid input speed string %s.\n", text != nullptr ? text : "");
     return -1;
 }
 
