@@ -38,7 +38,7 @@ std::string sample(std::size_t length) {
 
 TEST(HkString, IsOnePointerWithTheLengthWordBeforeTheText) {
     static_assert(sizeof(HkString) == sizeof(char*));
-    for (const std::size_t length : {0, 1, 2, 3, 4, 7, 8, 15, 16, 30, 31, 32, 33, 64, 1000, 1 << 20}) {
+    for (const unsigned length : {0U, 1U, 2U, 3U, 4U, 7U, 8U, 15U, 16U, 30U, 31U, 32U, 33U, 64U, 1000U, 1U << 20}) {
         expectIs(HkString(sample(length).c_str()), sample(length));
     }
     expectIs(HkString(std::string_view("a\0b", 3)), std::string("a\0b", 3));

@@ -77,7 +77,7 @@ TEST(MessageManager, TellsAHandlerTheOrigin) {
 TEST(MessageManager, TakesTextsOfAnyLengthAndNoFormat) {
     const MessageRecorder recorder;
     Texts expected;
-    for (const std::size_t length : {0, 1, 510, 511, 512, 513, 1 << 20}) {
+    for (const unsigned length : {0U, 1U, 510U, 511U, 512U, 513U, 1U << 20}) {
         expected.emplace_back(length, 'x');
         origin.report().issueStatus("%s", expected.back().c_str());
     }

@@ -31,10 +31,8 @@ public:
 
 /// A port of this host that nobody listens on, different at each call.
 inline int freshPort() {
-    static int next = 20000 + static_cast<int>(testing::UnitTest::GetInstance()->random_seed() * 37 +
-                                               reinterpret_cast<std::uintptr_t>(&next) / 4096) %
-                                  20000;
-    return next++;
+    static unsigned next = 20000 + static_cast<unsigned>(reinterpret_cast<std::uintptr_t>(&next) / 4096) % 20000;
+    return static_cast<int>(next++);
 }
 
 /// A server that listens; its port is found by trying.

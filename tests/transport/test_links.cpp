@@ -32,7 +32,7 @@ protected:
 };
 
 using Links = testing::Types<SocketLink, PipeLink, ByteByByteLink>;
-TYPED_TEST_SUITE(Transport, Links);
+TYPED_TEST_SUITE(Transport, Links, );
 
 TYPED_TEST(Transport, FieldsAreTheSameBytesEverywhere) {
     TessalPortMux& client = this->link.client;
