@@ -2,12 +2,13 @@
 #pragma once
 
 #include <cstdlib>
+#include <filesystem>
 #include <optional>
 #include <string>
 
 class EnvironmentVariable {
 public:
-    /// @param value null takes the variable away
+    /// @param value UTF-8; null takes the variable away
     EnvironmentVariable(std::string name, const char* value) : m_name(std::move(name)) {
         if (const char* const former = std::getenv(m_name.c_str())) {
             m_former = former;
@@ -20,7 +21,9 @@ public:
 
     void set(const char* value) {
 #if defined(_WIN32)
-        _putenv_s(m_name.c_str(), value != nullptr ? value : "");  // this host takes an empty variable away
+        const auto wide = [](const char* text) { return std::filesystem::u8path(text).wstring(); };
+        // This host takes an empty variable away.
+        _wputenv_s(wide(m_name.c_str()).c_str(), wide(value != nullptr ? value : "").c_str());
 #else
         value != nullptr ? ::setenv(m_name.c_str(), value, 1) : ::unsetenv(m_name.c_str());
 #endif
