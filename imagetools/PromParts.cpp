@@ -62,11 +62,9 @@ Problem findPartSize(const char* part, std::uint64_t& size) {
 
 std::optional<std::uint64_t> parseSize(const char* text) {
     std::string_view digits = HkStr::View(text);
-    std::uint64_t unit = 1;
-    if (!digits.empty() && unitOf(digits.back()) != 0) {
-        unit = unitOf(digits.back());
-        digits.remove_suffix(1);
-    }
+    const std::uint64_t named = digits.empty() ? 0 : unitOf(digits.back());
+    const std::uint64_t unit = named != 0 ? named : 1;
+    digits.remove_suffix(named != 0 ? 1 : 0);
     const bool isHex = digits.size() > 2 && digits[0] == '0' && (digits[1] == 'x' || digits[1] == 'X');
     digits.remove_prefix(isHex ? 2 : 0);
     const unsigned base = isHex ? 16 : 10;

@@ -143,7 +143,9 @@ unsigned char* LRBitVec::arrayFor(std::size_t capacity, std::size_t kept, std::s
     const std::size_t commonEnd = std::max(resumedFrom, common);
     unsigned char* const array = newArray(bytes);
     copyBytes(array, m_data, keptEnd);
-    copyBytes(array + resumedFrom, m_data + resumedFrom, commonEnd - resumedFrom);
+    if (commonEnd > resumedFrom) {  // else there may be no array to point into
+        copyBytes(array + resumedFrom, m_data + resumedFrom, commonEnd - resumedFrom);
+    }
     setBytes(array + commonEnd, 0, bytes - commonEnd);
     const std::size_t lastByte = m_capacity / 8;
     if (capacity > m_capacity && m_capacity % 8 != 0 && (lastByte < keptEnd || lastByte >= resumedFrom)) {

@@ -2,8 +2,17 @@
 
 #include <new>
 
-Callback* ProgressInterfaceClass::m_cbData = new (std::nothrow) Callback;
-CallbackFunction* ProgressInterfaceClass::m_callback = new (std::nothrow) CallbackFunction;
+namespace {
+
+// The two objects live as long as the library is loaded and are never destroyed, so that progress may be reported from
+// other units' destructors; in memory of the library's own they leave nothing behind when it is unloaded.
+alignas(Callback) unsigned char recordMemory[sizeof(Callback)];
+alignas(CallbackFunction) unsigned char functionMemory[sizeof(CallbackFunction)];
+
+}  // namespace
+
+Callback* ProgressInterfaceClass::m_cbData = new (recordMemory) Callback;
+CallbackFunction* ProgressInterfaceClass::m_callback = new (functionMemory) CallbackFunction;
 
 bool ProgressInterfaceClass::setCallbackFunction(bool (*function)(Callback&)) {
     if (m_callback != nullptr) {
