@@ -13,12 +13,16 @@ library=$(find "$installed" -name 'libTessalUtility.so')
 soname=$(objdump -p "$library" | sed -n 's/ *SONAME *//p')
 [[ $soname =~ ^libTessalUtility\.so\.[0-9]+$ ]] || { echo "The soname is $soname." >&2; exit 1; }
 
-# What is exported belongs to a class or function that a public header names.
-exported=$(nm --dynamic --defined-only --demangle "$library" | sed -nE 's/^[0-9a-f]+ [TDBR] //p')
-private=
-while read -r symbol; do
-    name=$(grep -oE '[A-Za-z_][A-Za-z0-9_]*' <<<"${symbol%%(*}" | grep -vxE 'vtable|typeinfo|for|name|operator|HostKit|std|new|delete' | head -n 1)
-    grep -qrw -- "$name" "$installed/include" || private+="$symbol"$'\n'
-done <<<"$exported"
+# What is exported belongs to a class or function that a public header names: the first word of the symbol that is not C++'s.
+symbols=$(nm --dynamic --defined-only --demangle "$library" | sed -nE 's/^[0-9a-f]+ [TDBR] //p')
+words=$(grep -rohE '[A-Za-z_][A-Za-z0-9_]*' "$installed/include" | sort -u)
+private=$(awk '
+    NR == FNR { public[$0]; next }
+    {
+        count = split($0, part, /[^A-Za-z0-9_]+/)
+        for (i = 1; i <= count; ++i)
+            if (part[i] !~ /^(|vtable|typeinfo|for|name|operator|HostKit|std|new|delete)$/) break
+        if (!(part[i] in public)) print
+    }' <(echo "$words") <(echo "$symbols"))
 [ -z "$private" ] || { echo "Exported, but in no public header:"$'\n'"$private" >&2; exit 1; }
-echo "$soname, $(wc -l <<<"$exported") symbols"
+echo "$soname, $(wc -l <<<"$symbols") symbols"
