@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cstdio>
+#include <utility>
 
 #include "s/BitKernels.h"
 
@@ -85,8 +86,9 @@ std::string difference(const LRBitVec& a, const LRBitVec& b) {
         marks.erase(marks.find_last_of('^') + 1);
         const std::string head = lineHead(begin);
         const std::string indent(head.size(), ' ');
-        lines += head;
-        lines += left + '\n' + indent + right + '\n' + indent + marks + '\n';
+        for (const auto& [start, text] : {std::pair(&head, &left), {&indent, &right}, {&indent, &marks}}) {
+            lines.append(*start).append(*text).append("\n");
+        }
     }
     if (differing == 0) {
         return {};

@@ -42,7 +42,8 @@ void setProgressClock(ProgressClock clock) {
     lastClock = 0;
 }
 
-Callback::Callback(const Callback& other)
+// The copy's id is 0.
+Callback::Callback(const Callback& other)  // NOLINT(bugprone-copy-constructor-init)
     : Streamable(),
       m_totalCount(other.m_totalCount),
       m_currentCount(other.m_currentCount),

@@ -122,7 +122,7 @@ HkString FileUtility::convertPath(HkString path, HkString base) {
         return path;
     }
     const HkString root = startsWithParent(text) || base.IsEmpty() ? HkFile::getcwd() : base;
-    const HkString result(joined(climbed(HkStr::View(root), front.levels), front.tail));
+    HkString result(joined(climbed(HkStr::View(root), front.levels), front.tail));
     if (!HkFile::exist(result)) {
         origin.report().issueInfo("Path does not exist. Please check the path parameters %s, %s\n", path.c_str(),
                                   base.c_str());

@@ -354,7 +354,8 @@ std::size_t std::hash<LRBitVec>::operator()(const LRBitVec& vector) const noexce
 
 // ---- Assignment and logic.
 
-LRBitVec& LRBitVec::operator=(const LRBitVec& other) {
+// The same array means the same object.
+LRBitVec& LRBitVec::operator=(const LRBitVec& other) {  // NOLINT(bugprone-unhandled-self-assignment)
     if (m_data == nullptr || other.m_data == nullptr || m_data == other.m_data) {
         return *this;
     }

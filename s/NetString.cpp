@@ -5,7 +5,8 @@
 #include "HkStr.h"
 #include "s/RecordStream.h"
 
-NetString::NetString(const NetString& other) : Streamable() {
+// The copy's id is 0.
+NetString::NetString(const NetString& other) : Streamable() {  // NOLINT(bugprone-copy-constructor-init)
     setString(other.m_text);
 }
 

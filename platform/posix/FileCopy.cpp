@@ -17,7 +17,7 @@ namespace {
 constexpr mode_t accessRights = 0777;
 
 bool transfer(const Descriptor& source, Replacement& copy) {
-    constexpr std::size_t chunk = 128 * 1024;
+    constexpr std::size_t chunk = std::size_t{128} * 1024;
     const std::unique_ptr<char[]> buffer(new char[chunk]);
     for (;;) {
         const ssize_t got = uninterrupted([&] { return ::read(source.number(), buffer.get(), chunk); });

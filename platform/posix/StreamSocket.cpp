@@ -7,6 +7,7 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <chrono>
 #include <climits>
@@ -27,6 +28,10 @@ int descriptor(Socket socket) {
 
 Socket asSocket(int number) {
     return number >= 0 ? static_cast<Socket>(number) : noSocket;
+}
+
+Socket acceptOn(Socket server, sockaddr* address, socklen_t* length) {
+    return asSocket(retried([&] { return ::accept4(descriptor(server), address, length, SOCK_CLOEXEC); }));
 }
 
 sockaddr_in hostForm(const SocketAddress& address) {
@@ -84,14 +89,15 @@ public:
     void listen(Socket socket, int backlog) override { ::listen(descriptor(socket), backlog); }
 
     Socket accept(Socket socket, sockaddr* address, int* addressLength) override {
-        socklen_t length = addressLength != nullptr && *addressLength > 0 ? static_cast<socklen_t>(*addressLength) : 0;
-        socklen_t* const lengthPlace = address != nullptr && addressLength != nullptr ? &length : nullptr;
-        sockaddr* const place = lengthPlace != nullptr ? address : nullptr;
-        const int number = retried([&] { return ::accept4(descriptor(socket), place, lengthPlace, SOCK_CLOEXEC); });
-        if (number >= 0 && lengthPlace != nullptr) {
+        if (address == nullptr || addressLength == nullptr) {
+            return acceptOn(socket, nullptr, nullptr);
+        }
+        auto length = static_cast<socklen_t>(std::max(*addressLength, 0));
+        const Socket accepted = acceptOn(socket, address, &length);
+        if (accepted != noSocket) {
             *addressLength = static_cast<int>(length);
         }
-        return asSocket(number);
+        return accepted;
     }
 
     bool resolve(const char* name, std::uint16_t port, SocketAddress& address) override {
