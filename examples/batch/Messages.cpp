@@ -4,6 +4,8 @@
 #include <cstring>
 #include <utility>
 
+#include "ProgressBar.h"
+
 namespace {
 
 bool isUsage(const char* text) {
@@ -32,6 +34,7 @@ void Messages::sayOfAll(const std::string& text) const {
 void Messages::take(const HkMessage& message, void* context) {
     const Messages& messages = *static_cast<const Messages*>(context);
     if (message.level == HkMessageLevel::Status) {
+        ProgressBar::makeRoom();
         std::fputs(message.text, stdout);
     } else if (message.level == HkMessageLevel::Debug) {
         messages.write("", messages.m_isTraced ? message.text : "");
@@ -41,6 +44,7 @@ void Messages::take(const HkMessage& message, void* context) {
 }
 
 void Messages::write(const std::string& place, const char* text) const {
+    ProgressBar::makeRoom();
     std::fflush(stdout);
     std::fprintf(stderr, "%s%s", place.c_str(), text);
     std::fflush(stderr);

@@ -8,6 +8,7 @@
 
 #include "Completion.h"
 #include "Options.h"
+#include "ProgressBar.h"
 #include "Runner.h"
 
 namespace {
@@ -58,6 +59,7 @@ Status run(int argc, char** argv) {
         return AllFine;
     }
     chooseData(options.dataPath);
+    ProgressBar::install();
     return loadCommands() ? perform(options) : CannotRun;
 }
 

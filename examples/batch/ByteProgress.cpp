@@ -1,0 +1,35 @@
+#include "ByteProgress.h"
+
+#include <TessalUtility.h>
+
+#include <algorithm>
+
+#include "ProgressBar.h"
+
+namespace {
+
+constexpr int steps = 100;  // no finer: the filter before the function lets one report for each percent through
+
+}  // namespace
+
+ByteProgress::ByteProgress(const char* title, std::uint64_t total) : m_total(total) {
+    ProgressBar::expectBytes(total);
+    ProgressInterfaceClass::startProgressUpdate(steps, title);
+}
+
+ByteProgress::~ByteProgress() {
+    if (m_done == m_total) {
+        ProgressInterfaceClass::endProgressUpdate();
+        return;
+    }
+    ProgressInterfaceClass::getCBData()->setProgressStatus(PROGRESS_END);
+    ProgressInterfaceClass::callCallbackFunction();
+}
+
+void ByteProgress::add(std::uint64_t bytes) {
+    m_done += std::min(bytes, m_total - m_done);
+    const double share = m_total == 0 ? 0 : static_cast<double>(m_done) / static_cast<double>(m_total);
+    for (const int reached = static_cast<int>(share * steps); m_reported < reached; ++m_reported) {
+        ProgressInterfaceClass::updateProgress();
+    }
+}
