@@ -70,8 +70,9 @@ void tellQuarter() {
 
 void close(const Terminal& terminal) {
     ProgressBar::makeRoom();
-    const Progress& progress = operation.progress;
-    std::printf("%s\n", (terminal.width > 0 ? closingLine(progress) : plainLine(progress)).c_str());
+    const auto isDone = terminal.width > 0 ? closingLine : plainLine;
+    const auto line = operation.progress.percent < 100 ? stoppedLine : isDone;
+    std::printf("%s\n", line(operation.progress).c_str());
     std::fflush(stdout);
     operation.bytes = 0;
 }

@@ -1,6 +1,7 @@
 #include "ProgressLine.h"
 
 #include <algorithm>
+#include <cmath>
 #include <cstdio>
 #include <iterator>
 
@@ -33,7 +34,7 @@ std::string rateText(const Progress& progress) {
 
 std::string clockText(double seconds) {
     constexpr double longest = 359999;  // 99:59:59
-    const int whole = static_cast<int>(std::min(seconds, longest) + 0.5);
+    const int whole = static_cast<int>(std::lround(std::min(seconds, longest)));
     return whole < 3600 ? formatted("%d:%02d", whole / 60, whole % 60)
                         : formatted("%d:%02d:%02d", whole / 3600, whole / 60 % 60, whole % 60);
 }
@@ -80,9 +81,6 @@ std::string progressLine(const Progress& progress, const Terminal& terminal) {
 }
 
 std::string closingLine(const Progress& progress) {
-    if (progress.percent < 100) {
-        return plainLine(progress);
-    }
     const std::string rate = rateText(progress);
     return std::string(margin, ' ') + progress.title + ": " +
            (rate.empty() ? "done" : sizeText(static_cast<double>(progress.bytes))) +
@@ -91,4 +89,8 @@ std::string closingLine(const Progress& progress) {
 
 std::string plainLine(const Progress& progress) {
     return std::string(margin, ' ') + progress.title + formatted(": %d %%", progress.percent);
+}
+
+std::string stoppedLine(const Progress& progress) {
+    return std::string(margin, ' ') + progress.title + formatted(": stopped at %d %%", progress.percent);
 }

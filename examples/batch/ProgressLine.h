@@ -17,8 +17,11 @@ struct Progress {
 /// percent, rate and the time left. In a narrow one the bar and then the rest give way.
 std::string progressLine(const Progress& progress, const Terminal& terminal);
 
-/// The line that stays when the operation has ended on a terminal.
-std::string closingLine(const Progress& progress);
-
 /// The line for an output that keeps all it gets.
 std::string plainLine(const Progress& progress);
+
+/// The line that stays on a terminal when the operation is done.
+std::string closingLine(const Progress& progress);
+
+/// The line that stays when it was ended before all was done.
+std::string stoppedLine(const Progress& progress);
