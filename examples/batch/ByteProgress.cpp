@@ -29,7 +29,10 @@ ByteProgress::~ByteProgress() {
 void ByteProgress::add(std::uint64_t bytes) {
     m_done += std::min(bytes, m_total - m_done);
     const double share = m_total == 0 ? 0 : static_cast<double>(m_done) / static_cast<double>(m_total);
-    for (const int reached = static_cast<int>(share * steps); m_reported < reached; ++m_reported) {
+    const int reached = static_cast<int>(share * steps);
+    if (reached > m_reported) {
+        m_reported = reached;
+        ProgressInterfaceClass::getCBData()->setCurrentCount(reached - 1);
         ProgressInterfaceClass::updateProgress();
     }
 }

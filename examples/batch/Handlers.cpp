@@ -6,6 +6,7 @@
 #include "DeviceCommands.h"
 #include "Help.h"
 #include "HostCommands.h"
+#include "ImageCommands.h"
 #include "OptionCommands.h"
 #include "Session.h"
 
@@ -37,9 +38,11 @@ struct Row {
 };
 
 constexpr Row rows[] = {
+    {"checksum", checksum},
     {"closecable", closeCable},
     {"custcode", showOptions},
     {"erase", showOptions},
+    {"generate", generate},
     {"help", help},
     {"identify", identify},
     {"info", info},

@@ -4,6 +4,8 @@
 #include <list>
 #include <string>
 
+#include "ImageCommands.h"
+
 namespace {
 
 /// A range of I/O addresses; empty where the host told none.
@@ -21,24 +23,30 @@ void listPort(PortResource& port) {
                 range(port.getEcpStartAddress(), port.getEcpEndAddress()).c_str(), port.getPortDisplayName());
 }
 
-}  // namespace
-
-bool info(Session&, const HkCmdArgs& args) {
-    if (!args.isGiven("-ports")) {
-        return true;
-    }
+void listPorts() {
     CPortResources& host = *CPortResources::Instance();
     std::list<PortResource*> ports;
     host.getPortResources("LPT", ports);
     host.getPortResources("COM", ports);
     if (ports.empty()) {
         std::puts("  this host has no serial or parallel ports");
-        return true;
+        return;
     }
     std::printf("  %-6s %-11s %-11s %s\n", "port", "base", "ECP", "name");
     for (PortResource* const port : ports) {
         listPort(*port);
     }
     host.deletePortResources(ports);
+}
+
+}  // namespace
+
+bool info(Session&, const HkCmdArgs& args) {
+    if (args.isGiven("-ports")) {
+        listPorts();
+    }
+    if (args.isGiven("-prom")) {
+        listProms(args.text("-prom"));
+    }
     return true;
 }

@@ -23,10 +23,17 @@ struct Operation {
 
 Operation operation;
 
+bool isPreferred(TessalPreference::PREFERENCE preference, const char* value) {
+    return HkStr::ICompare(TessalPreference::getPreferenceObject()->getPreference(preference), value) == 0;
+}
+
+/// Where the bar goes; without width where lines are wanted.
 Terminal terminal() {
     const char* const noColour = HkEnv::GetEnv("NO_COLOR");
+    const bool isPlain = (noColour != nullptr && noColour[0] != '\0') || isPreferred(TessalPreference::COLOUR, "Never");
     Terminal result = standardOutput();
-    result.hasColours = result.hasColours && (noColour == nullptr || noColour[0] == '\0');
+    result.hasColours = result.hasColours && !isPlain;
+    result.width = isPreferred(TessalPreference::PROGRESS_STYLE, "Lines") ? 0 : result.width;
     return result;
 }
 
@@ -81,6 +88,9 @@ bool show(Callback& record) {
     if (record.getProgressStatus() == PROGRESS_START) {
         operation.began = Clock::now();
         operation.quarter = 0;
+    }
+    if (isPreferred(TessalPreference::PROGRESS_STYLE, "None")) {
+        return true;
     }
     measure(record);
     const Terminal output = terminal();

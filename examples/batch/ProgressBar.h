@@ -5,7 +5,7 @@
 
 /// Shows on standard output how far the library's operations are: a terminal has a bar on one line, which a closing
 /// line replaces at the end; any other output gets a line at each quarter. There is colour on a terminal unless the
-/// environment variable NO_COLOR is set.
+/// environment variable NO_COLOR is set. The preferences ProgressStyle and Colour choose less.
 class ProgressBar {
 public:
     ProgressBar() = delete;

@@ -40,6 +40,7 @@ Session::Outcome Session::takeText(const std::string& text) {
 }
 
 bool Session::runCommand(CommandSet& commands) {
+    m_tokens = &commands;
     HkString name(commands.getCommand(0));
     name.MakeLower();
     const char* const format = TessalCmdargs::findBatchFormatString(name);

@@ -35,6 +35,9 @@ public:
     /// Reports something about the current line.
     void say(const std::string& text) const { m_messages.say(text); }
 
+    /// The tokens of the current line, for operations of the library that take them.
+    CommandSet& tokens() { return *m_tokens; }
+
     /// Where the device serves that the cable leads to; empty for none.
     const std::string& device() const { return m_device; }
     void setDevice(const std::string& address) { m_device = address; }
@@ -51,6 +54,7 @@ private:
     bool m_isPrompt;
     bool m_hasEnded = false;
     int m_number = 0;
+    CommandSet* m_tokens = nullptr;
     std::string m_device;
     PortLock m_port;
     std::array<int, 4> m_counts{};
