@@ -16,7 +16,8 @@ constexpr const char* format =
     "  --complete <line=text> 'print the words that can stand last in the line'"
     "  -h|--help 'print this text' }"
     "[--stop-on-error] 'end at the first line that is refused'"
-    "[--data <directory=file>] 'where the data files are'";
+    "[--data <directory=file>] 'where the data files are' "
+    "[--host-root <directory=file>] 'what stands for / when the ports of a Linux host are looked for'";
 
 Options::Task taskOf(const HkCmdArgs& args) {
     if (args.isGiven("-h")) {
@@ -43,6 +44,7 @@ Options readOptions(int argc, char** argv) {
     options.script = args.text("script", 0, "");
     options.line = args.text("--complete", 0, "");
     options.dataPath = args.text("--data", 0, "");
+    options.hostRoot = args.text("--host-root", 0, "");
     options.stopOnError = args.isGiven("--stop-on-error");
     return options;
 }

@@ -10,6 +10,7 @@ struct Options {
     std::string script;    ///< path of the script, "-" for standard input
     std::string line;      ///< the line to complete
     std::string dataPath;  ///< directories of the data files; empty where none are given
+    std::string hostRoot;  ///< directory that stands for "/" when ports are looked for; empty for "/" itself
     bool stopOnError = false;
 };
 

@@ -59,6 +59,7 @@ Status run(int argc, char** argv) {
         return AllFine;
     }
     chooseData(options.dataPath);
+    CPortResources::setHostRoot(options.hostRoot.empty() ? nullptr : options.hostRoot.c_str());
     ProgressBar::install();
     return loadCommands() ? perform(options) : CannotRun;
 }
