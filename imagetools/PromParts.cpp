@@ -47,7 +47,7 @@ std::uint64_t unitOf(char letter) {
 
 Problem findPartSize(const char* part, std::uint64_t& size) {
     std::vector<HkString> known;
-    DeviceProfile::ProfileConfig selection("base", 1, ProfilePartBinding(0));
+    DeviceProfile::ProfileConfig selection("base", 1, ProfilePartUnbound);
     for (const char* const dataFile : dataFiles) {
         DeviceProfile::PartTable table(dataFile, selection);
         for (short row = 0; const char* const name = table.name(row); ++row) {

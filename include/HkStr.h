@@ -49,8 +49,9 @@ public:
     static int IsDigit(int ch);
     /// Non-zero for 0 to 127.
     static int IsAscii(int ch);
-    /// printf into @p dest; gives the number of characters written.
-    static int SPrintf(char* dest, const char* format, ...) TESSAL_PRINTF(2, 3);
+    /// printf into @p dest; gives the number of characters written. The compiler does not check the arguments, since
+    /// callers pass 32-bit numbers for `%lx`.
+    static int SPrintf(char* dest, const char* format, ...);
 
     /// The ASCII letter in lower or upper case, any other character unchanged.
     static char ToLower(char ch) { return ch >= 'A' && ch <= 'Z' ? static_cast<char>(ch + ('a' - 'A')) : ch; }

@@ -27,7 +27,9 @@ public:
     static constexpr std::uint32_t npos = 0xFFFFFFFFU;
 
     /// How GetIndexOfString compares.
-    enum CompareType { CompareExact = 0, CompareIgnoreCase = 1 };
+    using CompareType = int;
+    static constexpr CompareType CompareExact = 0;
+    static constexpr CompareType CompareIgnoreCase = 1;
 
     HkString() noexcept : m_text(emptyText()) {}
     /// Copies the text; null gives the empty text.

@@ -78,6 +78,8 @@ public:
     bool setOption(int index, HkString stringValue, bool boolValue, bool isBool);
     /// Writes a text option; false, and nothing changes, where the row is not described as one.
     bool setOption(std::vector<U_AttributePair> attributes, int index, HkString value);
+    /// The same, so that a literal is a text and not a truth value.
+    bool setOption(std::vector<U_AttributePair> attributes, int index, const char* value);
     /// Writes a switch; false, and nothing changes, where the row is not described as one.
     bool setOption(std::vector<U_AttributePair> attributes, int index, bool value);
 

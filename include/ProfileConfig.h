@@ -10,7 +10,9 @@
 
 /// How a selection is bound to the part it names. Kept with the selection and shown by printme; the profile is found
 /// by its name alone.
-enum ProfilePartBinding : int { ProfilePartUnbound = 0, ProfilePartBound = 1 };
+using ProfilePartBinding = int;
+constexpr ProfilePartBinding ProfilePartUnbound = 0;
+constexpr ProfilePartBinding ProfilePartBound = 1;
 
 /// Root of the selection classes: the profile's name, and the files that belong to the tool.
 ///

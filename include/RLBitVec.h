@@ -69,6 +69,10 @@ public:
     /// Writes @p count bits of @p value, at most 32: from bit count - 1 down with @p msbFirst, otherwise from bit 0 up.
     /// A count below 1 writes nothing.
     void updateBitField(unsigned int value, int start, int count, bool msbFirst);
+    /// The same, so that a constant 0 is a number and not a null text.
+    void updateBitField(int value, int start, int count, bool msbFirst) {
+        updateBitField(static_cast<unsigned int>(value), start, count, msbFirst);
+    }
     /// Writes one bit for each of the at most 32 characters: `1` is 1, every other character 0.
     void updateBitField(const char* bits, int start);
     /// Writes the whole bytes that hold @p count bits, each from its most significant bit down, or from its least

@@ -77,6 +77,10 @@ bool U_OptionsMgr::setOption(Attributes attributes, int index, HkString value) {
     return writeText(attributes, index, std::move(value));
 }
 
+bool U_OptionsMgr::setOption(Attributes attributes, int index, const char* value) {
+    return writeText(attributes, index, value);
+}
+
 bool U_OptionsMgr::setOption(Attributes attributes, int index, bool value) {
     return writeSwitch(attributes, index, value);
 }

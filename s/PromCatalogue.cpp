@@ -93,7 +93,7 @@ bool PromUtility::readPromList() {
     Catalogue& lists = catalogue();
     if (!lists.isRead) {
         lists.isRead = true;
-        ProfileConfig selection("base", 1, ProfilePartBinding(1));
+        ProfileConfig selection("base", 1, ProfilePartBound);
         readParts("proms.acd", selection, lists.standard);
         readParts("tessal.acd", selection, lists.extended);
     }
@@ -116,12 +116,12 @@ std::vector<promPartAndSizePair> PromUtility::GetSpecificPromList(const char* fa
 }
 
 int PromUtility::GetPromSizeByName(const char* part) {
-    ProfileConfig selection("base", 1, ProfilePartBinding(0));
+    ProfileConfig selection("base", 1, ProfilePartUnbound);
     return findSize("proms.dat", selection, part).value_or(notListed);
 }
 
 int PromUtility::GetExtendedPromSizeByName(const char* part) {
-    ProfileConfig selection("base", 1, ProfilePartBinding(0));
+    ProfileConfig selection("base", 1, ProfilePartUnbound);
     const std::optional<int> size = findSize("proms.acd", selection, part);
     return size ? *size : findSize("tessal.acd", selection, part).value_or(notListed);
 }
