@@ -5,6 +5,7 @@
 #include <fstream>
 #include <system_error>
 
+#include "platform/LargeMemory.h"
 #include "s/UnitOrigin.h"
 
 namespace DeviceProfile {
@@ -34,6 +35,7 @@ bool isBinary(const FileText& text) {
 /// Makes room for one more byte than @p size, keeping what is there.
 void reserve(FileText& text, std::size_t size) {
     std::unique_ptr<char[]> larger(new char[size + 1]);
+    platform::preferLargePages(larger.get(), size + 1);
     if (text.size != 0) {
         std::memcpy(larger.get(), text.bytes.get(), text.size);
     }

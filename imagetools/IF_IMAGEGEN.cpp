@@ -1,7 +1,6 @@
 #include "IF_IMAGEGEN.h"
 
 #include <filesystem>
-#include <numeric>
 #include <system_error>
 
 #include "HkFile.h"
@@ -9,6 +8,9 @@
 #include "imagetools/GeneratorJob.h"
 #include "imagetools/PromFileSet.h"
 #include "imagetools/PromImage.h"
+#include "imagetools/Records.h"
+#include "imagetools/WriteProgress.h"
+#include "s/ByteSum.h"
 #include "s/UnitOrigin.h"
 
 namespace {
@@ -26,7 +28,7 @@ bool isSameFile(const std::string& a, const std::string& b) {
 std::uint32_t checksumOf(const std::vector<Segment>& data, std::uint64_t size, unsigned char fill) {
     std::uint32_t sum = 0;
     for (const Segment& segment : data) {
-        sum = std::accumulate(segment.data, segment.data + segment.size, sum);
+        sum += static_cast<std::uint32_t>(sumBytes(segment.data, segment.size));
         size -= segment.size;
     }
     return sum + static_cast<std::uint32_t>(size) * fill;
@@ -43,10 +45,7 @@ public:
         if (problem.empty()) {
             problem = m_image.load(m_job);
         }
-        if (problem.empty()) {
-            problem = writeProms();
-        }
-        return problem.empty() ? m_files.putInPlace() : problem;
+        return problem.empty() ? writeAll() : problem;
     }
 
     /// One line for each PROM.
@@ -57,6 +56,27 @@ public:
     }
 
 private:
+    Problem writeAll() {
+        WriteProgress progress("Generating " + m_job.output + '.' + m_job.format->name, blocksExpected());
+        Problem problem = writeProms();
+        if (problem.empty()) {
+            problem = m_files.putInPlace();
+        }
+        if (problem.empty()) {
+            progress.complete();
+        }
+        return problem;
+    }
+
+    /// How many blocks of text the files will take, not counting what fills gaps between them.
+    std::uint64_t blocksExpected() const {
+        std::uint64_t bytes = 0;
+        for (const Segment& segment : m_image.segments().all()) {
+            bytes += segment.size;
+        }
+        return bytes / rowSize * m_job.format->rowLength / RecordSink::blockSize + m_job.proms.size();
+    }
+
     /// No file of the run may take the place of its own data.
     Problem checkFiles() const {
         for (std::size_t i = 0; i < m_job.proms.size(); ++i) {
@@ -139,7 +159,8 @@ unsigned char IF_IMAGEGEN::makeprom() {
         problem = run.perform(*m_command);
     }
     if (!problem.empty()) {
-        origin.report().issueInfo("No PROM file is generated: %s.\n", problem.c_str());
+        const char* const end = problem.back() == '?' ? "" : ".";
+        origin.report().issueInfo("No PROM file is generated: %s%s\n", problem.c_str(), end);
         return 1;
     }
     run.report();

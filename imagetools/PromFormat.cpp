@@ -6,8 +6,8 @@ namespace ImageTools {
 namespace {
 
 constexpr PromFormat formats[] = {
-    {"mcs", writeIntelHex, true}, {"exo", writeMotorolaRecords, true}, {"tek", writeTektronixHex, true},
-    {"hex", writeRawHex, false},  {"bin", writeRawBinary, false},
+    {"mcs", writeIntelHex, true, 44}, {"exo", writeMotorolaRecords, true, 47}, {"tek", writeTektronixHex, true, 48},
+    {"hex", writeRawHex, false, 33},  {"bin", writeRawBinary, false, 16},
 };
 
 }  // namespace

@@ -24,6 +24,7 @@ struct PromFormat {
     const char* name;  ///< the format's word on the command line, and the extension of its files
     PromWriter write;
     bool holdsAddresses;  ///< otherwise the bytes stand in a row, so gaps have to be filled
+    unsigned rowLength;   ///< about how many characters 16 bytes take
 };
 
 /// The format of that name, which is one of the argument format's choices.

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "s/ByteTables.h"
+#include "s/TextKernels.h"
 
 namespace ImageTools {
 namespace {
@@ -11,11 +11,6 @@ constexpr std::uint64_t imageBorder = 0x10000;  // of the images of a PROM, wher
 
 std::uint64_t roundedUp(std::uint64_t address) {
     return (address + imageBorder - 1) / imageBorder * imageBorder;
-}
-
-void mirrorBits(LoadedFile& file) {
-    std::transform(file.bytes(), file.bytes() + file.backing.size, file.bytes(),
-                   [](unsigned char byte) { return ByteTables::mirroredByte[byte]; });
 }
 
 std::string pastTheEnd(const std::string& path, std::uint64_t first, std::uint64_t last, std::uint64_t capacity) {
@@ -32,7 +27,7 @@ Problem PromImage::load(const GeneratorJob& job) {
             return "data file " + file.path + " cannot be used";
         }
         if (job.mirrorsBits) {
-            mirrorBits(*loaded);
+            textKernels().mirrorBytes(loaded->bytes(), loaded->backing.size, loaded->bytes());
         }
         if (Problem problem = place(job, file, *loaded); !problem.empty()) {
             return problem;

@@ -28,8 +28,11 @@ public:
     /// Sends on what is collected. False when anything could not be written, now or before.
     bool flush();
 
-private:
+    /// What is sent on at once, at most.
     static constexpr std::size_t blockSize = std::size_t{256} << 10;
+
+private:
+    void send(const char* data, std::size_t size);
 
     platform::ReplacementFile& m_file;
     std::unique_ptr<char[]> m_block;

@@ -29,7 +29,8 @@ public:
     /// failure an information message tells what is wrong, there is no new file, and the old ones are as they were.
     ///
     /// The checksum is the sum of all bytes of the PROM in 32 bits, as its file holds them; what the file leaves open
-    /// counts as the fill byte, 0xFF unless told otherwise.
+    /// counts as the fill byte, 0xFF unless told otherwise. The writing is reported to ProgressInterfaceClass, so one
+    /// thread at a time generates; an end with fewer steps than the operation has says that it failed.
     unsigned char makeprom();
 
 private:

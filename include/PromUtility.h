@@ -54,7 +54,7 @@ public:
     static void DecomposeComboAddress(HkString comboHex, HkString& rsPin, HkString& startHex, int addressBits);
 
     /// Runs the PROM file generator on a tokenised command, whose first token is the command word. The generator
-    /// reports by itself; true on success.
+    /// reports by itself, its progress too; true on success.
     static bool generate(CommandSet* command);
     /// How much space the data of a file will need, in bytes: for "*.elf" and "*.mem", in this case of letters, the
     /// span of its program sections, for any other file its size, modulo 2^32. 0, with a message, where an object or

@@ -8,6 +8,7 @@
 #include "DataPath.h"
 #include "HkFile.h"
 #include "IF_IMAGEGEN.h"
+#include "ProgressInterfaceClass.h"
 #include "TessalCmdargs.h"
 #include "images/ElfImage.h"
 #include "images/Workbench.h"
@@ -149,6 +150,27 @@ TEST_F(Generator, AFailedReplacementBringsTheFirstFilesBack) {
     EXPECT_TRUE(bench.generate("-output p -format bin -size 16 16 16 -data @a"));
     EXPECT_EQ(bench.read("p_0.bin").size(), 16U);
     EXPECT_EQ(bench.read("p_2.bin").size(), 8U);
+}
+
+TEST_F(Generator, ReportsItsProgressBlockByBlock) {
+    static std::vector<std::string> reports;
+    ProgressInterfaceClass::setCallbackFunction([](Callback& record) {
+        reports.push_back(std::to_string(record.getProgressStatus()) + ' ' + std::to_string(record.getCurrentCount()) +
+                          '/' + std::to_string(record.getTotalCount()));
+        return true;
+    });
+    bench.write("a", noise(600000));
+    for (const char* const format : {"bin", "hex", "mcs"}) {
+        reports.clear();
+        EXPECT_TRUE(bench.generate(std::string("-generic -output p -data @a -format ") + format));
+        const int steps = ProgressInterfaceClass::getCBData()->getTotalCount();
+        EXPECT_GE(steps, 3) << format;
+        EXPECT_EQ(reports.size(), static_cast<std::size_t>(steps) + 1) << format;
+        EXPECT_EQ(reports.back(), "1 " + std::to_string(steps) + '/' + std::to_string(steps)) << format;
+    }
+    EXPECT_FALSE(bench.generate("-size 1 1M -output no/where -data @a"));
+    EXPECT_EQ(reports.back().substr(0, 4), "1 0/") << "it has failed before all was done";
+    ProgressInterfaceClass::setCallbackFunction(nullptr);
 }
 
 TEST(GeneratorFormat, IsThatOfTheShippedCommandAndTakesWhatTheOptionRowsMake) {
