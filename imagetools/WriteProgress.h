@@ -22,8 +22,9 @@ public:
     WriteProgress& operator=(const WriteProgress&) = delete;
     /// An end with fewer steps than there are says that the run has failed.
     ~WriteProgress() {
-        if (!m_isDone) {
-            ProgressInterfaceClass::getCBData()->setProgressStatus(PROGRESS_END);
+        Callback* const record = ProgressInterfaceClass::getCBData();
+        if (!m_isDone && record != nullptr) {
+            record->setProgressStatus(PROGRESS_END);
             ProgressInterfaceClass::callCallbackFunction();
         }
     }
@@ -36,8 +37,8 @@ public:
 
     /// One block more. The number of blocks is estimated, so the last step is left to the end.
     static void step() {
-        const Callback& record = *ProgressInterfaceClass::getCBData();
-        if (record.getCurrentCount() + 1 < record.getTotalCount()) {
+        const Callback* const record = ProgressInterfaceClass::getCBData();
+        if (record != nullptr && record->getCurrentCount() + 1 < record->getTotalCount()) {
             ProgressInterfaceClass::updateProgress();
         }
     }

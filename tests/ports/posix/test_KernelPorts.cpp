@@ -1,14 +1,11 @@
-// Trees of files as kernels lay them out. They hold links, so each is kept as one text: a line names a file, whose
-// content follows behind "|", or a link and its target.
+// Trees of files as kernels lay them out, beside those of whole machines that the batch prompt's cases list.
 #include <gtest/gtest.h>
 
 #include <filesystem>
 #include <fstream>
-#include <list>
 #include <string>
 #include <vector>
 
-#include "CPortResources.h"
 #include "TemporaryDirectory.h"
 #include "platform/HostPorts.h"
 
@@ -31,26 +28,6 @@ void write(const fs::path& path, const std::string& content) {
     std::ofstream(path, std::ios::app | std::ios::binary) << content;
 }
 
-void build(const std::string& tree, const fs::path& root) {
-    std::ifstream lines(TEST_DATA_DIR "/hosts/" + tree + ".tree");
-    ASSERT_TRUE(lines.is_open());
-    fs::path current;
-    for (std::string line; std::getline(lines, line);) {
-        const std::size_t arrow = line.find(" -> ");
-        const std::size_t bar = line.find("| ");
-        if (line[0] == '#') {
-            continue;
-        }
-        if (arrow != std::string::npos) {
-            link(root / line.substr(0, arrow), line.substr(arrow + 4));
-        } else if (line[0] != ' ') {
-            write(current = root / line, "");
-        } else if (bar != std::string::npos) {
-            write(current, line.substr(bar + 2) + "\n");
-        }
-    }
-}
-
 /// The port as one text: display name and ranges.
 std::string shown(const platform::HostPort& port) {
     std::string text = port.text;
@@ -69,30 +46,6 @@ Texts portsOf(const std::string& root) {
         texts.push_back(shown(port));
     }
     return texts;
-}
-
-TEST(KernelPorts, AreThoseWithHardware) {
-    const struct {
-        const char* tree;
-        Texts ports;
-    } cases[] = {
-        {"pc",
-         {"Serial Port /dev/ttyS0 (COM1) 3f8-3ff", "Serial Port /dev/ttyS1 (COM2) 2f8-2ff",
-          "Printer Port /dev/parport0 (LPT1) 378-37f 778-77a"}},
-        {"board", {}},
-        {"usb",
-         {"Serial Port /dev/ttyS0 (COM1) c0c0-c0c7", "USB Serial Port /dev/ttyACM0 (COM2)",
-          "Serial Port /dev/ttyAMA0 (COM3)", "USB Serial Port /dev/ttyUSB0 (COM4)",
-          "USB Serial Port /dev/ttyUSB2 (COM5)", "USB Serial Port /dev/ttyUSB10 (COM6)",
-          "Printer Port /dev/parport0 (LPT1)"}},
-    };
-    for (const auto& c : cases) {
-        SCOPED_TRACE(c.tree);
-        const TemporaryDirectory root;
-        build(c.tree, root.path());
-        EXPECT_EQ(portsOf(root.path()), c.ports);
-    }
-    EXPECT_EQ(portsOf("/no such directory"), Texts());
 }
 
 /// As kernels do since they have a bus of serial ports: the nodes without hardware have a driver, too.
@@ -129,23 +82,7 @@ TEST(KernelPorts, StrangeTreesDoNoHarm) {
     EXPECT_EQ(portsOf(root.path()), (Texts{"Serial Port /dev/ttyS5 (COM6)", "Serial Port /dev/ttyUSB\n1 (COM1)",
                                            "Printer Port /dev/parport3 (LPT4) 378-37a",
                                            "Printer Port /dev/parport4 (LPT5)", "Printer Port /dev/parport5 (LPT6)"}));
-}
-
-TEST(KernelPorts, AreLookedForBelowTheHostRoot) {
-    const TemporaryDirectory root;
-    build("pc", root.path());
-    CPortResources::setHostRoot((root.path() + "/").c_str());
-    CPortResources& ports = *CPortResources::Instance();
-    CPortResources::setHostRoot(nullptr);
-    std::list<PortResource*> found;
-    EXPECT_TRUE(ports.getPortResources("LPT", found));
-    ASSERT_EQ(found.size(), 1U);
-    EXPECT_STREQ(found.front()->getPortDisplayName(), "Printer Port /dev/parport0 (LPT1)");
-    EXPECT_EQ(found.front()->getBaseStartAddress(), 0x378);
-    EXPECT_EQ(found.front()->getEcpEndAddress(), 0x77a);
-    ports.deletePortResources(found);
-    EXPECT_NE(ports.getPortResource("COM2"), nullptr);
-    ports.removeInstance();
+    EXPECT_EQ(portsOf("/no such directory"), Texts());
 }
 
 TEST(KernelPorts, OfThisHostAreNamedByTheirNodes) {
