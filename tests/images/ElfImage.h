@@ -20,29 +20,32 @@ public:
     std::uint64_t sectionsOffset = 0;  ///< e_shoff
 
     std::string text() const {
-        std::string out = std::string(
-                              "\x7F"
-                              "ELF") +
-                          static_cast<char>(is64 ? 2 : 1) + static_cast<char>(mostFirst ? 2 : 1) + '\x01';
-        out.resize(16);
+        std::string out =
+            "\x7F"
+            "ELF";
         const unsigned word = is64 ? 8 : 4;
         const std::uint64_t headerSize = is64 ? 0x40 : 0x34;
-        for (const auto& [value, width] :
-             std::vector<std::pair<std::uint64_t, unsigned>>{{2, 2},
-                                                             {0, 2},
-                                                             {1, 4},
-                                                             {0, word},
-                                                             {headerSize, word},
-                                                             {sectionsOffset, word},
-                                                             {0, 4},
-                                                             {headerSize, 2},
-                                                             {entrySize != 0 ? entrySize
-                                                              : is64         ? 0x38
-                                                                             : 0x20,
-                                                              2},
-                                                             {count != 0 ? count : entries.size(), 2},
-                                                             {0, 6}}) {
-            put(out, value, width);
+        const std::uint64_t usualEntrySize = is64 ? 0x38 : 0x20;
+        const struct {
+            std::uint64_t value;
+            unsigned width;
+        } fields[] = {{word / 4, 1},
+                      {mostFirst ? 2U : 1U, 1},
+                      {1, 1},
+                      {0, 9},
+                      {2, 2},
+                      {0, 2},
+                      {1, 4},
+                      {0, word},
+                      {headerSize, word},
+                      {sectionsOffset, word},
+                      {0, 4},
+                      {headerSize, 2},
+                      {entrySize != 0 ? entrySize : usualEntrySize, 2},
+                      {count != 0 ? count : entries.size(), 2},
+                      {0, 6}};
+        for (const auto& field : fields) {
+            put(out, field.value, field.width);
         }
         for (const Entry& e : entries) {
             put(out, e.type, 4);

@@ -5,7 +5,6 @@
 
 #include <algorithm>
 #include <cstdlib>
-#include <iomanip>
 #include <sstream>
 
 #include "M2IUtil_Data_Utils.h"
@@ -24,17 +23,28 @@ bool runs(const Workbench& bench, const std::string& command) {
         GTEST_SKIP() << program " is not installed"; \
     }
 
+/// The data files "a", 3 bytes short of 200 KiB, and "b" of 300 bytes.
+const std::string a = noise(200 * 1024 - 3);
+const std::string b = noise(300, 7);
+
 struct Layout {
-    const char* name;
-    const char* arguments;  ///< of data files "a", 3 bytes short of 200 KiB, and "b" of 300 bytes
+    const char* arguments;
     std::uint64_t a;
     std::uint64_t b;
+
+    std::uint64_t lowest() const { return std::min(a, b); }
+    /// The content of the PROM from the lowest address up, computed as plainly as can be.
+    std::string image() const {
+        std::string image(std::max(a + ::a.size(), b + ::b.size()) - lowest(), '\xFF');
+        image.replace(a - lowest(), ::a.size(), ::a);
+        return image.replace(b - lowest(), ::b.size(), ::b);
+    }
 };
 
 const Layout layouts[] = {
-    {"from 0", "-up 0 -data @a -up 40000 -data @b", 0, 0x40000},
-    {"across 64 KiB", "-up FFF1 -data @a -up FF -data @b", 0xFFF1, 0xFF},
-    {"above 24 bits", "-up 12FF0003 -data @a -up 13123456 -data @b", 0x12FF0003, 0x13123456},
+    {"-up 0 -data @a -up 40000 -data @b", 0, 0x40000},
+    {"-up FFF1 -data @a -up FF -data @b", 0xFFF1, 0xFF},
+    {"-up 12FF0003 -data @a -up 13123456 -data @b", 0x12FF0003, 0x13123456},
 };
 
 std::string mirrored(std::string text) {
@@ -48,52 +58,34 @@ std::string mirrored(std::string text) {
     return text;
 }
 
-/// The content of the PROMs from the lowest address up, computed as plainly as can be.
-std::string expectedImage(const std::string& a, std::uint64_t aAt, const std::string& b, std::uint64_t bAt,
-                          std::uint64_t& lowest) {
-    lowest = std::min(aAt, bAt);
-    std::string image(std::max(aAt + a.size(), bAt + b.size()) - lowest, '\xFF');
-    image.replace(aAt - lowest, a.size(), a);
-    image.replace(bAt - lowest, b.size(), b);
-    return image;
-}
-
 struct Format {
     const char* name;
     const char* reader;  ///< srec_cat's word for it
-    const char* target;  ///< objcopy's word for it; null where it has none
+    const char* target;  ///< objcopy's word for it; empty where it has none
 };
 
-const Format formats[] = {
-    {"mcs", "-intel", "ihex"}, {"exo", "-motorola", "srec"}, {"tek", "-tektronix-extended", nullptr}};
+const Format formats[] = {{"mcs", "-intel", "ihex"}, {"exo", "-motorola", "srec"}, {"tek", "-tektronix-extended", ""}};
 
 TEST(Independent, RecordFilesComeBackAsTheDataTheyWereMadeOf) {
     Workbench bench;
     NEEDS(bench, "srec_cat");
     NEEDS(bench, "objcopy");
-    const std::string a = noise(200 * 1024 - 3);
-    const std::string b = noise(300, 7);
     bench.write("a", a);
     bench.write("b", b);
     for (const Layout& layout : layouts) {
         for (const Format& format : formats) {
             for (const bool swapped : {false, true}) {
-                const std::string what = std::string(layout.name) + ' ' + format.name + (swapped ? " swapped" : "");
-                ASSERT_TRUE(bench.generate(std::string("-generic -output p -fillValue FF -format ") + format.name +
-                                           (swapped ? " " : " -disableswap ") + layout.arguments))
-                    << bench.said();
-                std::uint64_t lowest = 0;
-                const std::string image =
-                    expectedImage(swapped ? mirrored(a) : a, layout.a, swapped ? mirrored(b) : b, layout.b, lowest);
-                bench.write("expected", image);
-                const std::string file = std::string("p.") + format.name + ' ' + format.reader;
-                EXPECT_TRUE(runs(bench, "srec_cmp " + file + " expected -binary -offset " + std::to_string(lowest)))
-                    << what << ": " << bench.read("out");
-                if (format.target != nullptr) {
-                    EXPECT_TRUE(runs(bench, std::string("objcopy -I ") + format.target + " -O binary p." + format.name +
-                                                " back && cmp back expected"))
-                        << what << ": " << bench.read("out");
-                }
+                const std::string line = std::string("-generic -output p -fillValue FF -format ") + format.name +
+                                         (swapped ? " " : " -disableswap ") + layout.arguments;
+                ASSERT_TRUE(bench.generate(line)) << bench.said();
+                bench.write("expected", swapped ? mirrored(layout.image()) : layout.image());
+                const std::string file = std::string("p.") + format.name;
+                EXPECT_TRUE(runs(bench, "srec_cmp " + file + ' ' + format.reader + " expected -binary -offset " +
+                                            std::to_string(layout.lowest())))
+                    << line << ": " << bench.read("out");
+                const std::string target = std::string("objcopy -I ") + format.target + " -O binary ";
+                EXPECT_TRUE(format.target[0] == '\0' || runs(bench, target + file + " back && cmp back expected"))
+                    << line << ": " << bench.read("out");
             }
         }
     }
@@ -102,18 +94,13 @@ TEST(Independent, RecordFilesComeBackAsTheDataTheyWereMadeOf) {
 TEST(Independent, SplitPromsComeBackAsTheWhole) {
     Workbench bench;
     NEEDS(bench, "srec_cat");
-    const std::string a = noise(200 * 1024 - 3);
     bench.write("a", a);
     for (const Format& format : formats) {
         ASSERT_TRUE(bench.generate(std::string("-size 64K 100K 64K -disableswap -output p -format ") + format.name +
                                    " -up 11 -data @a"));
-        std::string whole;
-        for (int i = 0; i < 3; ++i) {
-            const std::string offsets[] = {"0", "0x10000", "0x29000"};
-            whole +=
-                "p_" + std::to_string(i) + '.' + format.name + ' ' + format.reader + " -offset " + offsets[i] + ' ';
-        }
-        EXPECT_TRUE(runs(bench, "srec_cat '(' " + whole + "')' -offset -0x11 -o back -binary && cmp back a"))
+        const std::string kind = std::string(".") + format.name + ' ' + format.reader;
+        EXPECT_TRUE(runs(bench, "srec_cat '(' p_0" + kind + " p_1" + kind + " -offset 0x10000 p_2" + kind +
+                                    " -offset 0x29000 ')' -offset -0x11 -o back -binary && cmp back a"))
             << format.name << ": " << bench.read("out");
     }
 }
@@ -121,35 +108,24 @@ TEST(Independent, SplitPromsComeBackAsTheWhole) {
 TEST(Independent, RawFilesComeBackAsTheData) {
     Workbench bench;
     NEEDS(bench, "xxd");
-    bench.write("a", noise(70001));
+    bench.write("a", a);
     ASSERT_TRUE(bench.generate("-generic -disableswap -output p -format hex -up 100 -data @a"));
-    ASSERT_TRUE(bench.generate("-generic -disableswap -output p -format bin -down 20000 -data @a"));
     EXPECT_TRUE(runs(bench, "xxd -r -p p.hex back && cmp back a")) << bench.read("out");
-    std::string reversed = bench.read("a");
-    std::reverse(reversed.begin(), reversed.end());
-    EXPECT_EQ(bench.read("p.bin"), reversed);
 }
 
 /// Lowest address and end of the loaded parts, as readelf tells them.
 bool rangeByReadelf(const Workbench& bench, std::uint64_t& lowest, std::uint64_t& highest) {
-    if (!runs(bench, "readelf -lW a.elf")) {
-        return false;
-    }
     lowest = ~std::uint64_t{0};
     highest = 0;
-    std::istringstream lines(bench.read("out"));
-    std::string line;
-    while (std::getline(lines, line)) {
-        std::istringstream fields(line);
-        std::string type;
-        std::uint64_t offset = 0, virtualAddress = 0, address = 0, size = 0;
-        if (fields >> type && type == "LOAD" &&
-            fields >> std::hex >> std::setbase(0) >> offset >> virtualAddress >> address >> size && size != 0) {
-            lowest = std::min(lowest, address);
-            highest = std::max(highest, address + size);
-        }
+    const bool isRead = runs(bench, "readelf -lW a.elf | awk '$1 == \"LOAD\" && $5 !~ /^0x0+$/ { print $4, $5 }'");
+    std::istringstream fields(bench.read("out"));
+    std::uint64_t address = 0;
+    std::uint64_t size = 0;
+    while (fields >> std::hex >> address >> size) {
+        lowest = std::min(lowest, address);
+        highest = std::max(highest, address + size);
     }
-    return highest != 0;
+    return isRead && highest != 0;
 }
 
 TEST(Independent, LinkedProgramsHaveTheRangeThatReadelfTells) {
