@@ -98,9 +98,11 @@ TEST(Independent, SplitPromsComeBackAsTheWhole) {
     for (const Format& format : formats) {
         ASSERT_TRUE(bench.generate(std::string("-size 64K 100K 64K -disableswap -output p -format ") + format.name +
                                    " -up 11 -data @a"));
-        const std::string kind = std::string(".") + format.name + ' ' + format.reader;
-        EXPECT_TRUE(runs(bench, "srec_cat '(' p_0" + kind + " p_1" + kind + " -offset 0x10000 p_2" + kind +
-                                    " -offset 0x29000 ')' -offset -0x11 -o back -binary && cmp back a"))
+        std::string line = "srec_cat '('";
+        for (const char* const part : {" p_0. -offset 0", " p_1. -offset 0x10000", " p_2. -offset 0x29000"}) {
+            line.append(part).insert(line.rfind(". ") + 1, std::string(format.name) + ' ' + format.reader);
+        }
+        EXPECT_TRUE(runs(bench, line + " ')' -offset -0x11 -o back -binary && cmp back a"))
             << format.name << ": " << bench.read("out");
     }
 }

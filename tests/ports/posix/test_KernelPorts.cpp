@@ -54,13 +54,13 @@ TEST(KernelPorts, NodesWithoutHardwareDoNotCount) {
     const fs::path base = root.path();
     for (int i = 0; i < 32; ++i) {
         const std::string number = std::to_string(i);
-        const std::string device = "devices/platform/serial8250/serial8250:0/serial8250:0." + number;
-        const std::string node = device + "/tty/ttyS" + number;
+        const fs::path device = "devices/platform/serial8250/serial8250:0/serial8250:0." + number;
+        const fs::path node = device / "tty" / ("ttyS" + number);
         link(base / "sys" / device / "driver", "../../../../../bus/serial-base/drivers/port");
         link(base / "sys" / node / "device", "../../../serial8250:0." + number);
         write(base / "sys" / node / "type", i == 17 ? "4\n" : "0\n");
         write(base / "sys" / node / "port", "0x0\n");
-        link(base / "sys/class/tty" / ("ttyS" + number), "../../" + node);
+        link(base / "sys/class/tty" / node.filename(), "../.." / node);
     }
     EXPECT_EQ(portsOf(root.path()), Texts{"Serial Port /dev/ttyS17 (COM18)"});
 }
