@@ -26,7 +26,8 @@
 /// bits that fall on indexes beyond the vector are passed over. A byte buffer must have the bytes that its count tells.
 ///
 /// **Threads.** m_initValue is not protected, and the conversions from a number to a new vector also write one private
-/// word: callers keep these apart. The other conversions hold no state.
+/// word: callers keep these apart. The texts that convertInt2HexString() keeps are behind a lock, and the other
+/// conversions hold no state.
 class TESSAL_API Hex2Bit {
 public:
     /// The fill value, false at first.
@@ -166,7 +167,8 @@ public:
 
     /// The value in hex, as many digits as convertInt2BitVec(int) makes groups of four bits: 1 gives `1`, 15 gives
     /// `0f`, 255 gives `0ff`, 256 gives `100`; 0 gives `00000000`, and so does a negative value. The text belongs to
-    /// the library and stays unchanged; a text is kept once, however often it is asked for.
+    /// the library and stays unchanged until the process ends, so that even destructors of statics may read it; a text
+    /// is kept once, however often it is asked for.
     static const char* convertInt2HexString(int value);
     /// The two 16-bit halves exchanged, as eight new hex digits; a negative value counts as 0.
     static char* swapWord(std::int32_t value);

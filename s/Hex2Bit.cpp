@@ -111,12 +111,16 @@ unsigned int filledNumber(std::int32_t value) {
     return Hex2Bit::m_initValue ? ~0U : static_cast<unsigned int>(std::max(value, 0));
 }
 
-/// A copy of the text that lives as long as the library, made once for each text.
+/// A copy of the text, made once for each text. It is never released: a caller may still read it while the statics of
+/// the program are destroyed.
 const char* keptText(std::string text) {
-    static std::mutex mutex;
-    static std::set<std::string> texts;
-    const std::lock_guard<std::mutex> lock(mutex);
-    return texts.insert(std::move(text)).first->c_str();
+    struct Kept {
+        std::mutex mutex;
+        std::set<std::string> texts;
+    };
+    static Kept& kept = *new Kept;
+    const std::lock_guard<std::mutex> lock(kept.mutex);
+    return kept.texts.insert(std::move(text)).first->c_str();
 }
 
 }  // namespace

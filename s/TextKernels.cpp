@@ -73,6 +73,6 @@ const TextKernels& portableTextKernels() {
 }
 
 const TextKernels& textKernels() {
-    static const TextKernels& fastest = wideTextKernels() != nullptr ? *wideTextKernels() : portableTextKernels();
-    return fastest;
+    const TextKernels* const wide = wideTextKernels();
+    return wide != nullptr ? *wide : portableTextKernels();
 }

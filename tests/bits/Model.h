@@ -5,10 +5,16 @@
 #include <algorithm>
 #include <cstdint>
 #include <functional>
-#include <string>
+#include <string_view>
 #include <vector>
 
 enum class Numbering { Storage, Usual, Forward, Mirrored };
+
+/// The value of a hex digit; -1 for any other character.
+inline int digitValue(char character) {
+    const std::size_t place = std::string_view("0123456789abcdefABCDEF").find(character);
+    return place == std::string_view::npos ? -1 : static_cast<int>(place < 16 ? place : place - 6);
+}
 
 struct Model {
     std::size_t capacity = 8;
@@ -30,7 +36,8 @@ struct Model {
                : numbering == Numbering::Usual  ? length - 1 - index
                                                 : index;
     }
-    bool at(std::size_t index) const { return bit(place(index)); }
+    bool read(std::size_t index) const { return index < length && bit(place(index)); }
+    void write(std::size_t index, bool value) { index < length ? put(place(index), value) : void(); }
 
     void setCapacity(std::size_t bits) {
         const std::size_t former = capacity;
@@ -52,17 +59,15 @@ struct Model {
     void concatenate(const Model& other) {
         const Model source = other;
         setCapacity(length + source.length + 64);
-        for (std::size_t i = 0; i < source.length; ++i) {
-            addBit(source.bit(i));
+        for (const bool value : source.bits()) {
+            addBit(value);
         }
     }
-    void addHex(const std::string& text) {
-        const std::string digits = "0123456789abcdefABCDEF";
-        std::size_t value = std::string::npos;
+    void addHex(std::string_view text) {
+        int value = -1;
         for (const char character : text) {
-            const std::size_t found = digits.find(character);
-            value = found != std::string::npos ? (found < 16 ? found : found - 6) : value;
-            for (int bit = 3; bit >= 0 && value != std::string::npos; --bit) {
+            value = digitValue(character) >= 0 ? digitValue(character) : value;
+            for (int bit = 3; bit >= 0 && value >= 0; --bit) {
                 addBit((value >> bit & 1) != 0);
             }
         }
@@ -110,37 +115,23 @@ struct Model {
     void operator^=(const Model& other) { combine(other, std::bit_xor<>()); }
     void operator|=(const Model& other) { combine(other, std::bit_or<>()); }
 
-    std::size_t first(bool value) const {
-        std::size_t i = 0;
-        while (i < length && bit(i) != value) {
-            ++i;
+    std::vector<bool> bits() const {
+        std::vector<bool> all;
+        for (std::size_t p = 0; p < length; ++p) {
+            all.push_back(bit(p));
         }
-        return i < length ? i : 0xFFFFFFFF;
-    }
-    std::size_t count() const {
-        std::size_t ones = 0;
-        for (std::size_t i = 0; i < length; ++i) {
-            ones += bit(i) ? 1 : 0;
-        }
-        return ones;
-    }
-    bool operator==(const Model& other) const {
-        bool same = length == other.length;
-        for (std::size_t i = 0; same && i < length; ++i) {
-            same = bit(i) == other.bit(i);
-        }
-        return same;
+        return all;
     }
     Model joined(const Model& other) const {
         Model result(length + other.length);
         for (std::size_t i = 0; i < result.length; ++i) {
-            result.put(result.length - 1 - i, i < length ? at(i) : other.at(i - length));
+            result.put(result.length - 1 - i, i < length ? read(i) : other.read(i - length));
         }
         return result;
     }
-    void field(std::size_t start, const std::vector<bool>& bits) {
-        for (std::size_t k = 0; k < bits.size(); ++k) {
-            put(place(length - start - 1 - k), bits[k]);
+    void field(std::size_t start, const std::vector<bool>& values) {
+        for (std::size_t k = 0; k < values.size(); ++k) {
+            put(place(length - start - 1 - k), values[k]);
         }
     }
 

@@ -5,8 +5,8 @@
 #include <random>
 
 #include "Model.h"
+#include "VectorWidth.h"
 #include "s/BitKernels.h"
-#include "s/WideVectors.h"
 
 namespace {
 
@@ -14,9 +14,6 @@ using namespace BitKernels;
 
 class Kernels : public testing::TestWithParam<bool> {
 protected:
-    void SetUp() override { wideVectors = wideVectors && GetParam(); }
-    void TearDown() override { wideVectors = m_wide; }
-
     /// An array that ends with the run.
     Model array(std::size_t first, std::size_t count) {
         Model model;
@@ -45,7 +42,7 @@ protected:
     std::mt19937 m_random{5};
 
 private:
-    const bool m_wide = wideVectors;
+    const VectorWidth m_width{GetParam()};
 };
 
 TEST_P(Kernels, CopyBetweenArraysAndInsideOne) {

@@ -9,8 +9,8 @@
 
 #include "Model.h"
 #include "RLBitVec.h"
+#include "VectorWidth.h"
 #include "s/BitVecAccess.h"
-#include "s/WideVectors.h"
 
 namespace {
 
@@ -78,11 +78,7 @@ class Duel {
     static constexpr bool mirrors = !std::is_same_v<Kind, LRBitVec>;
 
 public:
-    explicit Duel(unsigned seed) : chance(seed) {
-        wideVectors = wideVectors && !std::is_same_v<Kind, Narrow>;
-        models[0].numbering = models[1].numbering = numberingOf<Kind>;
-    }
-    ~Duel() { wideVectors = m_wide; }
+    explicit Duel(unsigned seed) : chance(seed) { models[0].numbering = models[1].numbering = numberingOf<Kind>; }
 
     /// One operation on one vector, with the other one or itself at its right side.
     void step() {
@@ -155,25 +151,32 @@ private:
         }
         const std::size_t index = chance.size(mine.length - 1);
         const std::size_t other = chance.size(mine.length - 1);
-        const bool bit = mine.at(index);
-        const bool otherBit = mine.at(other);
+        const bool bit = mine.read(index);
+        const bool otherBit = mine.read(other);
         const std::size_t way = chance.below(5);
         readingAgrees = a.testBit(index) == bit;
         choose(
             way, [&] { a.setBit(index); }, [&] { a.clearBit(index); }, [&] { a[index] = a(other); },
             [&] { a(index) |= otherBit; }, [&] { a[index] ^= true; });
         const bool expected[]{true, false, otherBit, bit || otherBit, !bit};
-        mine.put(mine.place(index), expected[way]);
+        mine.write(index, expected[way]);
     }
 
     void read(const Vector& a, const Model& mine, const Vector& b, const Model& theirs) {
         LRBitVec same(a);
         same.setCapacity(mine.capacity + 9);
         const LRBitVec turned = !static_cast<const LRBitVec&>(a);
-        readingAgrees = a.firstTrue() == mine.first(true) && a.firstFalse() == mine.first(false) &&
-                        (a == b) == (mine == theirs) && (a != b) != (mine == theirs) && a.count() == mine.count() &&
-                        same == a && std::hash<LRBitVec>()(same) == std::hash<LRBitVec>()(a) &&
-                        turned.count() == mine.length - mine.count() && turned.getCapacity() == mine.length + 7;
+        const std::vector<bool> bits = mine.bits();
+        const auto first = [&](bool value) {
+            const auto found = std::find(bits.begin(), bits.end(), value);
+            return found != bits.end() ? static_cast<std::size_t>(found - bits.begin()) : 0xFFFFFFFF;
+        };
+        const auto ones = static_cast<std::size_t>(std::count(bits.begin(), bits.end(), true));
+        const bool isEqual = bits == theirs.bits();
+        readingAgrees = a.firstTrue() == first(true) && a.firstFalse() == first(false) && (a == b) == isEqual &&
+                        (a != b) != isEqual && a.count() == ones && same == a &&
+                        std::hash<LRBitVec>()(same) == std::hash<LRBitVec>()(a) &&
+                        turned.count() == mine.length - ones && turned.getCapacity() == mine.length + 7;
     }
 
     template <class Right>
@@ -197,7 +200,7 @@ private:
                 return;
             }
             for (std::size_t i = theirs.length; i-- > 0;) {
-                bits.push_back(theirs.at(i));
+                bits.push_back(theirs.read(i));
             }
             a.updateBitField(&b, static_cast<int>(start), flag);
         } else if (operation == 21) {
@@ -225,7 +228,7 @@ private:
     Model models[2];
     std::size_t operation = 0;
     bool readingAgrees = true;
-    const bool m_wide = wideVectors;
+    const VectorWidth m_width{!std::is_same_v<Kind, Narrow>};
 };
 
 template <class Kind>

@@ -1,19 +1,11 @@
 // The first line is a format, each further line an argument. Everything that can be asked is asked.
-#include <cstdint>
-#include <cstdlib>
-#include <sstream>
 #include <string>
 #include <vector>
 
 #include "HkCmdArgs.h"
+#include "fuzz/Fuzz.h"
 
 namespace {
-
-void require(bool condition) {
-    if (!condition) {
-        std::abort();
-    }
-}
 
 void readAll(const HkCmdArgs& args, const HkCmdArgInfo& info) {
     const char* const name = info.names[0];
@@ -33,13 +25,11 @@ void readAll(const HkCmdArgs& args, const HkCmdArgInfo& info) {
 
 }  // namespace
 
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    std::istringstream lines(std::string(reinterpret_cast<const char*>(data), size));
-    std::string format;
-    std::getline(lines, format);
+void fuzz(Input input) {
+    const std::string format = input.line();
     std::vector<std::string> words{"command"};
-    for (std::string line; std::getline(lines, line);) {
-        words.push_back(line);
+    while (!input.isEmpty()) {
+        words.push_back(input.line());
     }
     std::vector<const char*> argv;
     for (const std::string& word : words) {
@@ -56,5 +46,4 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     args.order();
     args.help();
     HkCmdArgs::complete(argc, argv.data(), format.c_str());
-    return 0;
 }

@@ -1,12 +1,10 @@
 // Paths of any form against the state table of the front, walked character by character.
-#include <cstdint>
-#include <cstdlib>
 #include <optional>
 #include <string>
 
 #include "FileUtility.h"
 #include "HkFile.h"
-#include "HkMessageManager.h"
+#include "fuzz/Fuzz.h"
 
 namespace {
 
@@ -55,18 +53,12 @@ std::string rootOf(const std::string& path, const std::string& base) {
 }  // namespace
 
 /// The input is a path and, behind its first line end, a base.
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    HkMessageManager::setHandler([](const HkMessage&, void*) {}, nullptr);
-    const std::string input(reinterpret_cast<const char*>(data), size);
-    const std::size_t end = input.find('\n');
-    const std::string path = input.substr(0, end).c_str();
-    const std::string base = end != std::string::npos ? input.substr(end + 1).c_str() : "";
+void fuzz(Input input) {
+    const std::string path = input.line();
+    const std::string base = input.text();
     std::string expected = path;
     if (!isAbsolute(path)) {
         expected = convertBySteps(path, rootOf(path, base)).value_or(path);
     }
-    if (expected != FileUtility::convertPath(path.c_str(), base.c_str()).c_str()) {
-        std::abort();
-    }
-    return 0;
+    require(expected == FileUtility::convertPath(path.c_str(), base.c_str()).c_str());
 }

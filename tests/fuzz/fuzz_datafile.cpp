@@ -1,12 +1,8 @@
 // Any bytes as a data file: keys and cells must be those of the plain model. The first byte chooses the separators.
-
-#include <algorithm>
-#include <cstdint>
-#include <cstdlib>
 #include <string>
 
-#include "HkMessageManager.h"
 #include "deviceprofile/CellStore.h"
+#include "fuzz/Fuzz.h"
 #include "keyed/DataFileModel.h"
 
 namespace {
@@ -32,9 +28,7 @@ void checkCells(CellStore& store, const std::string& key, const std::string& val
         for (int field = -1; field < mostIndexes; ++field) {
             const char* const cell = store.cell(key.c_str(), split.row, row, split.field, field);
             const auto expected = modelCell(value, split.row, row, split.field, field);
-            if ((cell != nullptr) != expected.has_value() || (cell != nullptr && *expected != cell)) {
-                std::abort();
-            }
+            require((cell != nullptr) == expected.has_value() && (cell == nullptr || *expected == cell));
             if (!expected && field >= 0) {
                 break;
             }
@@ -44,21 +38,14 @@ void checkCells(CellStore& store, const std::string& key, const std::string& val
 
 }  // namespace
 
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    HkMessageManager::setHandler([](const HkMessage&, void*) {}, nullptr);
-    if (size == 0) {
-        return 0;
-    }
-    const Separators& split = separators[data[0] % std::size(separators)];
-    const std::string bytes(data + 1, data + size);
+void fuzz(Input input) {
+    const Separators& split = separators[input.byte() % std::size(separators)];
+    const std::string bytes(input.bytes());
     CellStore store(fileText(bytes), "base", {true, true});
-    if (store.cell("no such key\x01", "", 0, "", 0) != nullptr &&
-        modelSection(bytes, "base").count("no such key\x01") == 0) {
-        std::abort();
-    }
-    for (const auto& [key, value] : modelSection(bytes, "base")) {
+    const ModelSection section = modelSection(bytes, "base");
+    require(store.cell("no such key\x01", "", 0, "", 0) == nullptr || section.count("no such key\x01") != 0);
+    for (const auto& [key, value] : section) {
         checkCells(store, key, value, {"", ""});
         checkCells(store, key, value, split);
     }
-    return 0;
 }

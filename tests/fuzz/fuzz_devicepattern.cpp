@@ -1,11 +1,10 @@
 // A pattern chooses the same texts as a plain model, which follows every way that wildcards can go at once.
-#include <cstdint>
-#include <cstdlib>
 #include <string>
 #include <vector>
 
 #include "CableDriver.h"
 #include "HkStr.h"
+#include "fuzz/Fuzz.h"
 
 namespace {
 
@@ -34,18 +33,13 @@ bool drop(std::string& text, char prefix) {
 }  // namespace
 
 /// The input is a pattern and, behind its first line end, a text.
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    const std::string input(reinterpret_cast<const char*>(data), size);
-    const std::size_t end = input.find('\n');
-    std::string pattern = input.substr(0, end).c_str();
-    const std::string text = end != std::string::npos ? input.substr(end + 1).c_str() : "";
-    const std::string whole = pattern;
+void fuzz(Input input) {
+    const std::string whole = input.line();
+    const std::string text = input.text();
+    std::string pattern = whole;
     const DeviceIdPattern parsed = parseDeviceIdPattern(whole.c_str());
     const bool isInstanceId = drop(pattern, '@');
     const bool isLiteral = drop(pattern, '\'');
-    if ((parsed.m_isInstanceId != 0) != isInstanceId ||
-        matchDeviceId(text.c_str(), parsed) != matchByModel(text, pattern, !isLiteral)) {
-        std::abort();
-    }
-    return 0;
+    require((parsed.m_isInstanceId != 0) == isInstanceId);
+    require(matchDeviceId(text.c_str(), parsed) == matchByModel(text, pattern, !isLiteral));
 }

@@ -1,24 +1,11 @@
 // Any bytes to text and numbers, and any text to numbers, against the model.
-
-#include <cstdint>
-#include <cstdlib>
 #include <memory>
-#include <string>
-#include <vector>
 
 #include "Hex2Bit.h"
-#include "HkMessageManager.h"
+#include "fuzz/Fuzz.h"
 #include "hex/HexModel.h"
 
 namespace {
-
-using HexModel::Numbering;
-
-void require(bool holds) {
-    if (!holds) {
-        std::abort();
-    }
-}
 
 std::string taken(const char* text) {
     const std::unique_ptr<const char[]> owner(text);
@@ -37,7 +24,7 @@ void bytesToText(const unsigned char* bytes, int bits) {
 }
 
 void vectorToText(const RLBitVec& vector, Numbering numbering, std::size_t address, int digits, bool stop) {
-    const HexModel::Vector model(vector, numbering);
+    const Model model = HexModel::modelOf(vector, numbering);
     std::string expected;
     std::vector<char> out(vector.length() / 8 + 1);
     const bool result = HexModel::characters(model, stop, expected);
@@ -54,24 +41,21 @@ void textToText(const std::string& text, int count) {
         require(taken(Hex2Bit::convertBinString2HexString(text.c_str(), count, byteMode)) ==
                 HexModel::hexText(cut, byteMode));
     }
-    const RLBitVec empty(4 * static_cast<std::size_t>(count));
-    HexModel::Vector model(empty, Numbering::Usual);
+    Model model = HexModel::modelOf(RLBitVec(4 * static_cast<std::size_t>(count)));
     HexModel::loadHex(model, text, 4 * count, false, false);
     require(Hex2Bit::convertHexString2Int(text.c_str(), count) == HexModel::number(model));
 }
 
 }  // namespace
 
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    if (size < 4) {
-        return 0;
-    }
-    // Messages of vectors that are no text are not shown.
-    HkMessageManager::setHandler([](const HkMessage&, void*) {}, nullptr);
-    const unsigned flags = data[0];
-    const std::uint8_t* const bytes = data + 4;
-    const std::size_t length = 8 * (size - 4) - (size > 4 ? flags % 8 : 0);
-    const auto numbering = static_cast<Numbering>((flags >> 3) % 3);
+void fuzz(Input input) {
+    const unsigned flags = input.byte();
+    const unsigned address = input.byte();
+    const auto digits = static_cast<int>(input.byte() / 2 * 2);
+    const auto count = static_cast<int>(input.byte());
+    const auto* const bytes = reinterpret_cast<const unsigned char*>(input.bytes().data());
+    const std::size_t length = 8 * input.bytes().size() - (input.isEmpty() ? 0 : flags % 8);
+    const Numbering numbering = HexModel::numberings[(flags >> 3) % 3];
 
     bytesToText(bytes, static_cast<int>(length));
     HexModel::NumberedVec vector(length, numbering);
@@ -80,7 +64,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
             vector.setBit(i);
         }
     }
-    vectorToText(vector, numbering, data[1], data[2] / 2 * 2, flags >= 128);
-    textToText(reinterpret_cast<const char*>(std::string(bytes, bytes + size - 4).c_str()), data[3]);
-    return 0;
+    vectorToText(vector, numbering, address, digits, flags >= 128);
+    textToText(input.text(), count);
 }

@@ -1,14 +1,11 @@
 // Any bytes as a record stream: what was read is a whole record, which comes back as it is.
-
-#include <cstdint>
-#include <cstdlib>
 #include <sstream>
-#include <string>
 
 #include "CableInfo.h"
+#include "fuzz/Fuzz.h"
 
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    std::istringstream in(std::string(reinterpret_cast<const char*>(data), size));
+void fuzz(Input input) {
+    std::istringstream in(std::string(input.bytes()));
     CableInfo cable;
     cable.readStream(in);
     std::stringstream form;
@@ -17,8 +14,5 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     again.readStream(form);
     std::ostringstream second;
     again.writeStream(second);
-    if (form.fail() || second.str() != form.str()) {
-        std::abort();
-    }
-    return 0;
+    require(!form.fail() && second.str() == form.str());
 }

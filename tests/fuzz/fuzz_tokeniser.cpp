@@ -1,25 +1,17 @@
 // The tokeniser agrees with its slow model on any line, and tokens joined with quotes and split again are the same.
-
-#include <cstdlib>
 #include <memory>
 #include <optional>
 #include <string>
 #include <vector>
 
 #include "CommandSet.h"
-#include "HkMessageManager.h"
 #include "TessalException.h"
 #include "commands/TokeniserModel.h"
+#include "fuzz/Fuzz.h"
 
 namespace {
 
 using Words = std::vector<std::string>;
-
-void require(bool condition) {
-    if (!condition) {
-        std::abort();
-    }
-}
 
 /// The tokens of the line; nothing when the tokeniser refuses it.
 std::optional<Words> split(const std::string& line) {
@@ -46,14 +38,11 @@ std::string join(const Words& words) {
 
 }  // namespace
 
-extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t size) {
-    HkMessageManager::setHandler([](const HkMessage&, void*) {}, nullptr);
-    // As the library sees it, the line ends at the first zero byte.
-    const std::string line(std::string(reinterpret_cast<const char*>(data), size).c_str());
+void fuzz(Input input) {
+    const std::string line = input.text();
     const std::optional<Words> words = split(line);
     require(words == splitByModel(line));
     if (words) {
         require(split(join(*words)) == words);
     }
-    return 0;
 }

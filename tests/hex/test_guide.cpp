@@ -5,32 +5,27 @@
 #include <algorithm>
 #include <fstream>
 #include <iterator>
-#include <memory>
 #include <sstream>
-#include <string>
-#include <vector>
 
+#include "BitView.h"
 #include "Hex2Bit.h"
+#include "hex/HexModel.h"
 
 namespace {
 
 using Cells = std::vector<std::string>;
 
-/// The rows of the guide's tables that have so many cells and begin with an example.
+/// The cells, without the blanks and back quotes around them, of the guide's table rows that begin with an example and
+/// have so many.
 std::vector<Cells> rowsOf(std::size_t cellCount) {
     std::ifstream guide(TEST_DATA_DIR "/../../docs/bits.md");
     std::vector<Cells> rows;
     for (std::string line; std::getline(guide, line);) {
         Cells cells;
-        std::istringstream row(line.rfind("| `", 0) == 0 ? line.substr(2) : "");
+        std::istringstream row(line.rfind("| `", 0) == 0 ? line.substr(1, line.rfind('|')) : "");
         for (std::string cell; std::getline(row, cell, '|');) {
-            const std::size_t end = cell.find_last_not_of(" \r");
-            cell = cell.substr(cell[0] == ' ' ? 1 : 0, end + (cell[0] == ' ' ? 0 : 1));
-            const bool isQuoted = cell.size() > 1 && cell.front() == '`' && cell.back() == '`';
-            cells.push_back(isQuoted ? cell.substr(1, cell.size() - 2) : cell);
-        }
-        if (!cells.empty() && cells.back().empty()) {
-            cells.pop_back();
+            const std::size_t first = std::min(cell.find_first_not_of(" `\r"), cell.size());
+            cells.push_back(cell.substr(first, cell.find_last_not_of(" `\r") + 1 - first));
         }
         if (cells.size() == cellCount) {
             rows.push_back(cells);
@@ -40,12 +35,13 @@ std::vector<Cells> rowsOf(std::size_t cellCount) {
 }
 
 std::string bytesOf(const RLBitVec& vector) {
-    std::ostringstream text;
+    std::string text;
     for (std::size_t i = 0; i < vector.getNumberBytes(); ++i) {
-        text << (i > 0 ? " " : "") << "0123456789ABCDEF"[vector.data()[i] >> 4]
-             << "0123456789ABCDEF"[vector.data()[i] & 15];
+        char byte[4];
+        std::snprintf(byte, sizeof byte, " %02X", vector.data()[i]);
+        text += byte;
     }
-    return text.str();
+    return text.substr(1);
 }
 
 TEST(BitsGuide, LoadsBecomeWhatTheTableSays) {
@@ -55,11 +51,7 @@ TEST(BitsGuide, LoadsBecomeWhatTheTableSays) {
         RLBitVec vector(std::stoul(row[1]));
         Hex2Bit::convertHexString2BitVec(&vector, row[0].c_str(), std::stoi(row[2]), row[3] == "true", row[4] == "true",
                                          false);
-        std::string indexes;
-        for (std::size_t i = 0; i < vector.length(); ++i) {
-            indexes.push_back(vector.testBit(i) ? '1' : '0');
-        }
-        EXPECT_EQ(indexes, row[5]) << testing::PrintToString(row);
+        EXPECT_EQ(toGroupedText(vector, 0), row[5]) << testing::PrintToString(row);
         EXPECT_EQ(bytesOf(vector), row[6]) << testing::PrintToString(row);
     }
 }
@@ -78,13 +70,6 @@ TEST(BitsGuide, TextsBecomeWhatTheTableSays) {
     }
 }
 
-struct Forward : RLBitVec {
-    explicit Forward(std::size_t length) : RLBitVec(length) { m_forwardIndex = 1; }
-};
-struct ByteMirror : RLBitVec {
-    explicit ByteMirror(std::size_t length) : RLBitVec(length) { m_byteMirrorIndex = 1; }
-};
-
 /// One thing of each index, with blanks between.
 template <class Thing>
 std::string ofEachIndex(std::size_t length, Thing thing) {
@@ -96,11 +81,10 @@ std::string ofEachIndex(std::size_t length, Thing thing) {
 }
 
 /// The storage position of each index of a vector, found by setting the bit.
-template <class Vector>
-std::string positionsOf(std::size_t length) {
+std::string positionsOf(std::size_t length, Numbering numbering) {
     return ofEachIndex(length, [=](std::size_t i) {
-        Vector vector(length);
-        vector.setBit(i);
+        HexModel::NumberedVec vector(length, numbering);
+        numbering == Numbering::Storage ? vector.LRBitVec::setBit(i) : vector.setBit(i);
         return LRBitVec(vector.data(), (length + 7) / 8 * 8).firstTrue();
     });
 }
@@ -122,10 +106,9 @@ std::size_t sourceOf(std::size_t i, std::size_t digits, bool descending, bool by
 TEST(BitsGuide, PicturesShowWhatTheLibraryDoes) {
     std::ostringstream table;
     table << "what,of,values\n"
-          << "index,LRBitVec," << positionsOf<LRBitVec>(12) << "\nindex,RLBitVec," << positionsOf<RLBitVec>(12)
-          << "\nindex,RLBitVec forward," << positionsOf<Forward>(12) << "\nindex,RLBitVec byte mirror,"
-          << positionsOf<ByteMirror>(12) << "\n";
-    const std::string positions = positionsOf<RLBitVec>(16);
+          << "index,LRBitVec," << positionsOf(12, Numbering::Storage) << "\nindex,RLBitVec,"
+          << positionsOf(12, Numbering::Usual) << "\nindex,RLBitVec forward," << positionsOf(12, Numbering::Forward)
+          << "\nindex,RLBitVec byte mirror," << positionsOf(12, Numbering::Mirrored) << "\n";
     for (const bool descending : {false, true}) {
         for (const bool byteSwap : {false, true}) {
             std::ostringstream load;
@@ -134,8 +117,8 @@ TEST(BitsGuide, PicturesShowWhatTheLibraryDoes) {
             const auto bit = [&](std::size_t i) { return vector->testBit(i) ? 1 : 0; };
             const auto source = [&](std::size_t i) { return sourceOf(i, 4, descending, byteSwap); };
             table << "bit" << load.str() << ofEachIndex(16, bit) << "\ncharacter" << load.str()
-                  << ofEachIndex(16, source) << "\nposition" << load.str() << positions << "\ndata" << load.str()
-                  << bytesOf(*vector) << "\n";
+                  << ofEachIndex(16, source) << "\nposition" << load.str() << positionsOf(16, Numbering::Usual)
+                  << "\ndata" << load.str() << bytesOf(*vector) << "\n";
         }
     }
     std::ifstream file(TEST_DATA_DIR "/../../docs/pictures/bits.csv");
