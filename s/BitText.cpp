@@ -36,38 +36,39 @@ void forEachPiece(Run run, Order order, Emit emit) {
     }
 }
 
-}  // namespace
-
-void makeBinary(Run run, Order order, char* text) {
+/// Writes the text of a run: convert(bytes, count, text) turns whole bytes, and length(bits) tells the characters of so
+/// many bits.
+template <class Convert, class Length>
+void makeText(Run run, Order order, char* text, Convert convert, Length length) {
     const bool falling = order == Order::Falling;
     forEachPiece(run, order, [&](const unsigned char* bytes, std::size_t count, std::size_t bits) {
         const std::size_t whole = bits / 8;
-        textKernels().unpackBits(falling ? bytes + count - whole : bytes, whole, falling, text);
-        text += 8 * whole;
+        convert(falling ? bytes + count - whole : bytes, whole, text);
+        text += length(8 * whole);
         if (whole < count) {
             char last[8];
-            textKernels().unpackBits(falling ? bytes : bytes + whole, 1, falling, last);
-            std::memcpy(text, last, bits % 8);
-            text += bits % 8;
+            convert(falling ? bytes : bytes + whole, 1, last);
+            std::memcpy(text, last, length(bits % 8));
+            text += length(bits % 8);
         }
     });
 }
 
+}  // namespace
+
+void makeBinary(Run run, Order order, char* text) {
+    const auto convert = [&](const unsigned char* bytes, std::size_t count, char* to) {
+        textKernels().unpackBits(bytes, count, order == Order::Falling, to);
+    };
+    makeText(run, order, text, convert, [](std::size_t bits) { return bits; });
+}
+
 void makeHex(Run run, Order order, Digits digits, char* text) {
     const bool falling = order == Order::Falling;
-    const ByteOrder byteOrder{falling, falling == (digits == Digits::OfBytes)};
-    forEachPiece(run, order, [&](const unsigned char* bytes, std::size_t count, std::size_t bits) {
-        const std::size_t whole = bits / 8;
-        textKernels().encodeHex(falling ? bytes + count - whole : bytes, whole, byteOrder, text);
-        text += 2 * whole;
-        if (whole < count) {
-            char last[2];
-            textKernels().encodeHex(falling ? bytes : bytes + whole, 1, byteOrder, last);
-            const std::size_t length = hexLength(bits % 8, digits);
-            std::memcpy(text, last, length);
-            text += length;
-        }
-    });
+    const auto convert = [&](const unsigned char* bytes, std::size_t count, char* to) {
+        textKernels().encodeHex(bytes, count, {falling, falling == (digits == Digits::OfBytes)}, to);
+    };
+    makeText(run, order, text, convert, [=](std::size_t bits) { return hexLength(bits, digits); });
 }
 
 void packText(std::string_view text, BitMark mark, Order order, unsigned char* to) {

@@ -44,6 +44,15 @@ void makeHex(Run run, Order order, Digits digits, char* text);
 /// order from the last byte's top bit down. The bits that are left over become 0.
 void packText(std::string_view text, BitMark mark, Order order, unsigned char* to);
 
+/// The characters that packHexRepeating() takes at most.
+constexpr std::size_t longestAppended = 4096;
+
+bool isHexDigit(char character);
+
+/// Turns characters, at least one, into the bits that appending them gives, four each. A character that is no digit
+/// repeats the one before it; @p last is the digit before the text, and then the last one of it.
+void packHexRepeating(unsigned char* bytes, std::string_view text, char& last);
+
 /// Which indexes of the vector the text's stream of bits takes.
 struct Placement {
     std::size_t size;  ///< the stream keeps its last `size` bits, characters that are no digits counting as four

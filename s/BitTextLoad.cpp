@@ -1,5 +1,6 @@
 // Text to bits.
 #include <algorithm>
+#include <array>
 #include <cstring>
 
 #include "s/BitKernels.h"
@@ -57,7 +58,7 @@ std::size_t digitsOnly(std::string_view text, bool byteSwap, char* digits) {
         const std::size_t partner = i ^ 1U;
         const char character = text[byteSwap && partner < text.size() ? partner : i];
         digits[count] = character;
-        count += ByteTables::valueOf(character) != ByteTables::notADigit ? 1 : 0;
+        count += isHexDigit(character) ? 1 : 0;
     }
     if (byteSwap) {
         for (std::size_t i = 1; i < count; i += 2) {
@@ -89,6 +90,28 @@ bool takeDigits(StreamWriter& writer, std::string_view digits, bool descending, 
 }
 
 }  // namespace
+
+bool isHexDigit(char character) {
+    return ByteTables::valueOf(character) != ByteTables::notADigit;
+}
+
+void packHexRepeating(unsigned char* bytes, std::string_view text, char& last) {
+    constexpr ByteOrder asAppended{false, true};
+    const std::size_t pairs = text.size() / 2;
+    std::array<char, longestAppended> repeated;
+    if (!textKernels().decodeHex(text.data(), pairs, asAppended, bytes) || !isHexDigit(text.back())) {
+        for (std::size_t i = 0; i < text.size(); ++i) {
+            last = isHexDigit(text[i]) ? text[i] : last;
+            repeated[i] = last;
+        }
+        text = {repeated.data(), text.size()};
+        textKernels().decodeHex(text.data(), pairs, asAppended, bytes);
+    }
+    last = text.back();
+    if (text.size() % 2 != 0) {
+        bytes[pairs] = static_cast<unsigned char>(ByteTables::mirroredByte[ByteTables::valueOf(last)] >> 4);
+    }
+}
 
 void loadHex(unsigned char* bytes, std::size_t length, std::string_view text, Placement placement, bool byteSwap) {
     const std::size_t textBits = 4 * text.size();

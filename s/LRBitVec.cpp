@@ -13,8 +13,7 @@
 #include "HkStream.h"
 #include "RLBitVec.h"
 #include "s/BitKernels.h"
-#include "s/ByteTables.h"
-#include "s/TextKernels.h"
+#include "s/BitText.h"
 #include "s/UnitOrigin.h"
 
 namespace {
@@ -53,32 +52,6 @@ void copyBytes(unsigned char* target, const unsigned char* source, std::size_t c
 void setBytes(unsigned char* target, unsigned char value, std::size_t count) {
     if (count != 0) {
         std::memset(target, value, count);
-    }
-}
-
-constexpr std::size_t hexChunk = 4096;
-
-bool isHexDigit(char character) {
-    return ByteTables::valueOf(character) != ByteTables::notADigit;
-}
-
-/// Turns at most a chunk of characters into the bits that appending them gives, four each. A character that is no digit
-/// repeats the one before it; @p last is the digit before the text, and then the last one of it.
-void decodeRepeating(unsigned char* bytes, std::string_view text, char& last) {
-    constexpr ByteOrder asAppended{false, true};
-    const std::size_t pairs = text.size() / 2;
-    std::array<char, hexChunk> repeated;
-    if (!textKernels().decodeHex(text.data(), pairs, asAppended, bytes) || !isHexDigit(text.back())) {
-        for (std::size_t i = 0; i < text.size(); ++i) {
-            last = isHexDigit(text[i]) ? text[i] : last;
-            repeated[i] = last;
-        }
-        text = {repeated.data(), text.size()};
-        textKernels().decodeHex(text.data(), pairs, asAppended, bytes);
-    }
-    last = text.back();
-    if (text.size() % 2 != 0) {
-        bytes[pairs] = static_cast<unsigned char>(ByteTables::mirroredByte[ByteTables::valueOf(last)] >> 4);
     }
 }
 
@@ -245,9 +218,10 @@ void LRBitVec::append(const LRBitVec& other) {
 
 void LRBitVec::appendHex(std::string_view hexText) {
     const auto* const begin = hexText.data();
-    const auto* const first = std::find_if(begin, begin + hexText.size(), isHexDigit);
+    const auto* const first = std::find_if(begin, begin + hexText.size(), BitText::isHexDigit);
     hexText.remove_prefix(static_cast<std::size_t>(first - begin));
-    std::array<unsigned char, hexChunk / 2> bytes;
+    constexpr std::size_t chunk = BitText::longestAppended;
+    std::array<unsigned char, chunk / 2> bytes;
     char last = '0';
     const bool inBlocks = appendsInBlocks();
     std::unique_ptr<unsigned char[]> former;  // which may hold the text
@@ -255,9 +229,9 @@ void LRBitVec::appendHex(std::string_view hexText) {
         const std::size_t added = hexText.size() * 4;
         former = replaceArray(capacityAfterAppending(added), m_numberBits, m_numberBits + added);
     }
-    for (; !hexText.empty(); hexText.remove_prefix(std::min(hexChunk, hexText.size()))) {
-        const std::string_view digits = hexText.substr(0, hexChunk);
-        decodeRepeating(bytes.data(), digits, last);
+    for (; !hexText.empty(); hexText.remove_prefix(std::min(chunk, hexText.size()))) {
+        const std::string_view digits = hexText.substr(0, chunk);
+        BitText::packHexRepeating(bytes.data(), digits, last);
         if (inBlocks) {
             BitKernels::copyBits(m_data, m_numberBits, bytes.data(), 0, 4 * digits.size());
             m_numberBits += 4 * digits.size();
