@@ -417,7 +417,7 @@ void LRBitVec::printData(bool debug, int bitsPerLine) {
     print("\n]\n", 0);
 }
 
-HkStream& operator<<(HkStream& stream, LRBitVec vector) {  // NOLINT(performance-unnecessary-value-param)
+HkStream& operator<<(HkStream& stream, LRBitVec vector) {
     return stream << framedText(vector).c_str();
 }
 
