@@ -17,6 +17,12 @@ std::size_t clamped(int index, std::size_t size) {
     return index < 0 ? 0 : std::min(static_cast<std::size_t>(index), size);
 }
 
+/// The description of a row; null where there is no such row.
+template <class Attributes>
+auto findDescription(Attributes& attributes, int index) -> decltype(attributes.data()) {
+    return isIndexOf(attributes.size(), index) ? &attributes[static_cast<std::size_t>(index)] : nullptr;
+}
+
 }  // namespace
 
 U_AttributePair::U_AttributePair(const char* attribute, bool isBool, const char* dashValue, int groupSize, bool enabled)
@@ -33,6 +39,31 @@ HkString U_OptionsMgr::getOptionEnabledText() {
 
 HkString U_OptionsMgr::getAssociatedDeviceText() {
     return "_AssociatedDevice";
+}
+
+void U_OptionsMgr::appendDescriptions(const tESSALNS::OptionRow* rows, std::size_t count, Attributes& attributes) {
+    attributes.reserve(attributes.size() + count);
+    std::for_each(rows, rows + count, [&attributes](const tESSALNS::OptionRow& row) {
+        attributes.emplace_back(row.key, row.isSwitch(), row.dashValue, row.groupSize, true);
+    });
+}
+
+HkString U_OptionsMgr::keyOf(const Attributes& attributes, int index) {
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr ? description->m_attribute : HkString();
+}
+
+bool U_OptionsMgr::isRowEnabled(const Attributes& attributes, int index) {
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr && description->m_enabled;
+}
+
+bool U_OptionsMgr::enableRow(Attributes& attributes, int index, bool enabled) {
+    U_AttributePair* const description = findDescription(attributes, index);
+    if (description != nullptr) {
+        description->m_enabled = enabled;
+    }
+    return description != nullptr;
 }
 
 void U_OptionsMgr::init_options(Attributes attributes) {
@@ -86,13 +117,13 @@ bool U_OptionsMgr::setOption(Attributes attributes, int index, bool value) {
 }
 
 bool U_OptionsMgr::writeText(const Attributes& attributes, int index, HkString value) {
-    return isIndexOf(attributes.size(), index) && !attributes[static_cast<std::size_t>(index)].m_isBool &&
-           setOption(index, std::move(value), false, false);
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr && !description->m_isBool && setOption(index, std::move(value), false, false);
 }
 
 bool U_OptionsMgr::writeSwitch(const Attributes& attributes, int index, bool value) {
-    return isIndexOf(attributes.size(), index) && attributes[static_cast<std::size_t>(index)].m_isBool &&
-           setOption(index, HkString(), value, true);
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr && description->m_isBool && setOption(index, HkString(), value, true);
 }
 
 bool U_OptionsMgr::isOptionSet(int index) const {

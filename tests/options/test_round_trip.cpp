@@ -43,7 +43,7 @@ std::string shown(const std::vector<HkString>& texts) {
 template <class Manager, class Option, class Reader>
 class RoundTrips {
 public:
-    RoundTrips(const Operation<Manager>& operation, const OptionRow* rows, bool asksForPosition)
+    RoundTrips(const Operation<Manager>& operation, const tESSALNS::OptionRow* rows, bool asksForPosition)
         : m_operation(operation), m_rows(rows), m_asksForPosition(asksForPosition) {}
 
     /// Every row alone, every row with the leader of its group, all rows, and random choices.
@@ -92,7 +92,7 @@ private:
 
     void give(Manager& manager, int row) const {
         const auto option = static_cast<Option>(row);
-        m_rows[row].isSwitch ? manager.setOption(option, true)
+        m_rows[row].isSwitch() ? manager.setOption(option, true)
                              : manager.setOption(option, std::string(m_rows[row].dashValue) == "-format" ? "hex" : "1");
     }
 
@@ -112,7 +112,7 @@ private:
     }
 
     const Operation<Manager>& m_operation;
-    const OptionRow* m_rows;
+    const tESSALNS::OptionRow* m_rows;
     bool m_asksForPosition;
     std::mt19937 m_random{20261124};
 };
@@ -120,11 +120,11 @@ private:
 TEST(OptionRoundTrip, EveryRowComesBackThroughItsCommand) {
     DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
     for (const auto& operation : deviceOperations) {
-        RoundTrips<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION, DeviceOptionReader>(operation, deviceRows, true)
+        RoundTrips<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION, DeviceOptionReader>(operation, tESSALNS::programOptionRows, true)
             .expectAll();
     }
     for (const auto& operation : modeOperations) {
-        RoundTrips<ModeOptionsMgr, tESSALNS::MODE_OPTION, ModeOptionReader>(operation, modeRows, false).expectAll();
+        RoundTrips<ModeOptionsMgr, tESSALNS::MODE_OPTION, ModeOptionReader>(operation, tESSALNS::modeOptionRows, false).expectAll();
     }
 }
 
