@@ -92,8 +92,9 @@ private:
 
     void give(Manager& manager, int row) const {
         const auto option = static_cast<Option>(row);
-        m_rows[row].isSwitch() ? manager.setOption(option, true)
-                             : manager.setOption(option, std::string(m_rows[row].dashValue) == "-format" ? "hex" : "1");
+        m_rows[row].isSwitch()
+            ? manager.setOption(option, true)
+            : manager.setOption(option, std::string(m_rows[row].dashValue) == "-format" ? "hex" : "1");
     }
 
     /// Arguments do not tell whose an empty one or a revision's bare switch is, so a revision's switch and digit are
@@ -120,11 +121,13 @@ private:
 TEST(OptionRoundTrip, EveryRowComesBackThroughItsCommand) {
     DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
     for (const auto& operation : deviceOperations) {
-        RoundTrips<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION, DeviceOptionReader>(operation, tESSALNS::programOptionRows, true)
+        RoundTrips<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION, DeviceOptionReader>(operation,
+                                                                                   tESSALNS::programOptionRows, true)
             .expectAll();
     }
     for (const auto& operation : modeOperations) {
-        RoundTrips<ModeOptionsMgr, tESSALNS::MODE_OPTION, ModeOptionReader>(operation, tESSALNS::modeOptionRows, false).expectAll();
+        RoundTrips<ModeOptionsMgr, tESSALNS::MODE_OPTION, ModeOptionReader>(operation, tESSALNS::modeOptionRows, false)
+            .expectAll();
     }
 }
 
