@@ -66,10 +66,6 @@ bool U_OptionsMgr::enableRow(Attributes& attributes, int index, bool enabled) {
     return description != nullptr;
 }
 
-void U_OptionsMgr::init_options(Attributes attributes) {
-    appendRows(attributes);
-}
-
 void U_OptionsMgr::appendRows(const Attributes& attributes) {
     m_options.reserve(m_options.size() + attributes.size());
     for (const U_AttributePair& attribute : attributes) {
@@ -104,18 +100,6 @@ bool U_OptionsMgr::setOption(int index, HkString stringValue, bool boolValue, bo
     return true;
 }
 
-bool U_OptionsMgr::setOption(Attributes attributes, int index, HkString value) {
-    return writeText(attributes, index, std::move(value));
-}
-
-bool U_OptionsMgr::setOption(Attributes attributes, int index, const char* value) {
-    return writeText(attributes, index, value);
-}
-
-bool U_OptionsMgr::setOption(Attributes attributes, int index, bool value) {
-    return writeSwitch(attributes, index, value);
-}
-
 bool U_OptionsMgr::writeText(const Attributes& attributes, int index, HkString value) {
     const U_AttributePair* const description = findDescription(attributes, index);
     return description != nullptr && !description->m_isBool && setOption(index, std::move(value), false, false);
@@ -140,10 +124,6 @@ bool U_OptionsMgr::getOption(int index) const {
 
 bool U_OptionsMgr::isOptionBool(int index) const {
     return isRow(index) && m_options[static_cast<std::size_t>(index)].m_isBool;
-}
-
-std::vector<HkString> U_OptionsMgr::getOptions(Attributes attributes, int first, int last) const {
-    return texts(attributes, first, last);
 }
 
 std::vector<HkString> U_OptionsMgr::texts(const Attributes& attributes, int first, int last) const {
@@ -198,10 +178,6 @@ void U_OptionsMgr::clearAllOptions() {
     }
 }
 
-void U_OptionsMgr::commit_options(Attributes) {}
-
-void U_OptionsMgr::commit_options(int, Attributes) {}
-
 void U_OptionsMgr::dumpAllOptions() const {
     int index = 0;
     for (const U_OptionsPair& row : m_options) {
@@ -213,3 +189,32 @@ void U_OptionsMgr::dumpAllOptions() const {
         ++index;
     }
 }
+
+// Callers hand their descriptions over by value.
+// NOLINTBEGIN(performance-unnecessary-value-param)
+
+void U_OptionsMgr::init_options(Attributes attributes) {
+    appendRows(attributes);
+}
+
+bool U_OptionsMgr::setOption(Attributes attributes, int index, HkString value) {
+    return writeText(attributes, index, std::move(value));
+}
+
+bool U_OptionsMgr::setOption(Attributes attributes, int index, const char* value) {
+    return writeText(attributes, index, value);
+}
+
+bool U_OptionsMgr::setOption(Attributes attributes, int index, bool value) {
+    return writeSwitch(attributes, index, value);
+}
+
+std::vector<HkString> U_OptionsMgr::getOptions(Attributes attributes, int first, int last) const {
+    return texts(attributes, first, last);
+}
+
+void U_OptionsMgr::commit_options(Attributes) {}
+
+void U_OptionsMgr::commit_options(int, Attributes) {}
+
+// NOLINTEND(performance-unnecessary-value-param)
