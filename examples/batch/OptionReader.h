@@ -99,4 +99,3 @@ private:
 };
 
 using DeviceOptionReader = OptionReader<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION>;
-using ModeOptionReader = OptionReader<ModeOptionsMgr, tESSALNS::MODE_OPTION>;

@@ -40,7 +40,7 @@ std::string shown(const std::vector<HkString>& texts) {
 }
 
 /// The round trips of the options of one operation.
-template <class Manager, class Option, class Reader>
+template <class Manager, class Option>
 class RoundTrips {
 public:
     RoundTrips(const Operation<Manager>& operation, const tESSALNS::OptionRow* rows, bool asksForPosition)
@@ -69,7 +69,7 @@ private:
         std::unique_ptr<HkCmdArgs> args;
         ASSERT_NO_THROW(args = parsed(options));
         Manager back;
-        Reader(*args, m_rows, back).read(m_operation.first, m_operation.last);
+        OptionReader<Manager, Option>(*args, m_rows, back).read(m_operation.first, m_operation.last);
         EXPECT_EQ(shown((back.*m_operation.options)()), shown(options));
     }
 
@@ -119,13 +119,11 @@ private:
 TEST(OptionRoundTrip, EveryRowComesBackThroughItsCommand) {
     DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
     for (const auto& operation : deviceOperations) {
-        RoundTrips<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION, DeviceOptionReader>(operation,
-                                                                                   tESSALNS::programOptionRows, true)
+        RoundTrips<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION>(operation, tESSALNS::programOptionRows, true)
             .expectAll();
     }
     for (const auto& operation : modeOperations) {
-        RoundTrips<ModeOptionsMgr, tESSALNS::MODE_OPTION, ModeOptionReader>(operation, tESSALNS::modeOptionRows, false)
-            .expectAll();
+        RoundTrips<ModeOptionsMgr, tESSALNS::MODE_OPTION>(operation, tESSALNS::modeOptionRows, false).expectAll();
     }
 }
 
