@@ -41,10 +41,9 @@ struct MapRow {
 
 std::vector<MapRow> mapRows() {
     std::vector<MapRow> rows;
-#define TESSAL_ROW(name, kind, dashValue, groupSize) \
-    rows.push_back({"PROGRAM_OPTIONS/" #name, dashValue, std::string(#kind) == "Switch"});
-    TESSAL_PROGRAM_OPTIONS(TESSAL_ROW)
-#undef TESSAL_ROW
+    for (const tESSALNS::OptionRow& row : tESSALNS::programOptionRows) {
+        rows.push_back({row.key, row.dashValue, row.isSwitch()});
+    }
     return rows;
 }
 

@@ -88,7 +88,7 @@ fs::path pathOf(const std::string& utf8) {
     }
 }
 
-std::vector<fs::path> placesOf(const std::string& name, const SearchPath& search) {
+std::vector<fs::path> placesOf(const std::string& name) {
     const fs::path file = pathOf(name);
     if (file.empty()) {
         return {};
@@ -97,7 +97,7 @@ std::vector<fs::path> placesOf(const std::string& name, const SearchPath& search
         return {file};
     }
     std::vector<fs::path> places;
-    for (const std::string& directory : search.directories) {
+    for (const std::string& directory : searchPath().directories) {
         places.push_back(pathOf(directory) / file);
     }
     return places;

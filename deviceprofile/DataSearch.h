@@ -23,7 +23,7 @@ std::filesystem::path pathOf(const std::string& utf8);
 
 /// The places where a file of this name is looked for, in order: one in each directory, or the name itself when it is
 /// an absolute path.
-std::vector<std::filesystem::path> placesOf(const std::string& name, const SearchPath& search);
+std::vector<std::filesystem::path> placesOf(const std::string& name);
 
 /// The directory that holds "bin" and "lib" of this installation; empty when the host does not tell.
 std::filesystem::path installationPrefix();

@@ -46,7 +46,7 @@ bool isFile(const fs::path& path) {
 
 /// The path of the index-th place of a file, empty when there is none.
 std::string findPlace(const std::string& name, bool mustExist, int index) {
-    for (const fs::path& place : DeviceProfile::placesOf(name, DeviceProfile::searchPath())) {
+    for (const fs::path& place : DeviceProfile::placesOf(name)) {
         if ((!mustExist || isFile(place)) && index-- == 0) {
             return place.u8string();
         }

@@ -4,6 +4,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 #include <string_view>
 
 #include "TessalExport.h"
@@ -53,9 +54,32 @@ public:
     /// callers pass 32-bit numbers for `%lx`.
     static int SPrintf(char* dest, const char* format, ...);
 
+    /// True when the first @p n bytes of both are the same; bytes, not letters, and no null. A short text costs no
+    /// call.
+    static bool AreSame(const char* a, const char* b, std::size_t n) {
+        if (n < sizeof(std::uint32_t) || n > 2 * sizeof(std::uint64_t)) {
+            return std::memcmp(a, b, n) == 0;
+        }
+        return n < sizeof(std::uint64_t) ? HaveSameEnds<std::uint32_t>(a, b, n) : HaveSameEnds<std::uint64_t>(a, b, n);
+    }
+
     /// The ASCII letter in lower or upper case, any other character unchanged.
     static char ToLower(char ch) { return ch >= 'A' && ch <= 'Z' ? static_cast<char>(ch + ('a' - 'A')) : ch; }
     static char ToUpper(char ch) { return ch >= 'a' && ch <= 'z' ? static_cast<char>(ch - ('a' - 'A')) : ch; }
+
+private:
+    /// Compares a first and a last piece, which may overlap and together are the whole.
+    template <class Piece>
+    static bool HaveSameEnds(const char* a, const char* b, std::size_t n) {
+        const std::size_t last = n - sizeof(Piece);
+        return Load<Piece>(a) == Load<Piece>(b) && Load<Piece>(a + last) == Load<Piece>(b + last);
+    }
+    template <class Piece>
+    static Piece Load(const char* from) {
+        Piece piece;
+        std::memcpy(&piece, from, sizeof piece);
+        return piece;
+    }
 };
 
 }  // namespace HostKit

@@ -147,7 +147,7 @@ private:
 
 /// Equal: the same length and the same bytes; case counts.
 inline bool operator==(const HkString& a, const HkString& b) {
-    return a.c_str() == b.c_str() || a.view() == b.view();
+    return a.Length() == b.Length() && HkStr::AreSame(a.c_str(), b.c_str(), a.Length());
 }
 inline bool operator!=(const HkString& a, const HkString& b) {
     return !(a == b);

@@ -7,6 +7,9 @@
 #pragma once
 
 #include <cstdint>
+#include <iterator>
+
+#include "OptionRow.h"
 
 // clang-format off
 #define TESSAL_MODE_OPTIONS(ROW) \
@@ -40,5 +43,13 @@ enum MODE_OPTION : std::int32_t {
     TESSAL_MODE_OPTIONS(TESSAL_ENUMERATOR)
 #undef TESSAL_ENUMERATOR
 };
+
+/// The same rows, in the order of their enumerators.
+inline constexpr OptionRow modeOptionRows[] = {
+#define TESSAL_ROW(name, kind, dashValue, groupSize) {"MODE_OPTIONS/" #name, OptionKind::kind, dashValue, groupSize},
+    TESSAL_MODE_OPTIONS(TESSAL_ROW)
+#undef TESSAL_ROW
+};
+static_assert(std::size(modeOptionRows) == 20, "callers pass row numbers");
 
 }  // namespace tESSALNS

@@ -2,9 +2,11 @@
 /// The machinery of the option tables: a description and a value for each row.
 #pragma once
 
+#include <cstddef>
 #include <vector>
 
 #include "HkString.h"
+#include "OptionRow.h"
 #include "TessalExport.h"
 
 /// Describes one row of an option table.
@@ -115,6 +117,12 @@ protected:
     using Attributes = std::vector<U_AttributePair>;
 
     void setOptionsList(std::vector<U_OptionsPair> options);
+
+    // The descriptions of a derived manager; nothing is found or done where there is no such row.
+    static void appendDescriptions(const tESSALNS::OptionRow* rows, std::size_t count, Attributes& attributes);
+    static HkString keyOf(const Attributes& attributes, int index);
+    static bool isRowEnabled(const Attributes& attributes, int index);
+    static bool enableRow(Attributes& attributes, int index, bool enabled);
 
     // The work of the operations of the same meaning above, on a table that is not copied.
     void appendRows(const Attributes& attributes);

@@ -7,6 +7,9 @@
 #pragma once
 
 #include <cstdint>
+#include <iterator>
+
+#include "OptionRow.h"
 
 // clang-format off
 #define TESSAL_PROGRAM_OPTIONS(ROW) \
@@ -125,5 +128,13 @@ enum PROGRAM_OPTION : std::int32_t {
     TESSAL_PROGRAM_OPTIONS(TESSAL_ENUMERATOR)
 #undef TESSAL_ENUMERATOR
 };
+
+/// The same rows, in the order of their enumerators.
+inline constexpr OptionRow programOptionRows[] = {
+#define TESSAL_ROW(name, kind, dashValue, groupSize) {"PROGRAM_OPTIONS/" #name, OptionKind::kind, dashValue, groupSize},
+    TESSAL_PROGRAM_OPTIONS(TESSAL_ROW)
+#undef TESSAL_ROW
+};
+static_assert(std::size(programOptionRows) == 105, "callers pass row numbers");
 
 }  // namespace tESSALNS

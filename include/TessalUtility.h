@@ -38,6 +38,8 @@
 #include "ModeOptionsMgr.h"
 #include "NetMessage.h"
 #include "NetString.h"
+#include "OptionRow.h"
+#include "OptionTableMgr.h"
 #include "OptionsMgr.h"
 #include "PortResource.h"
 #include "Preference.h"

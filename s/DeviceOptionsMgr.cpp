@@ -1,18 +1,8 @@
 #include "DeviceOptionsMgr.h"
 
-#include <iterator>
-#include <utility>
-
-#include "s/OptionTable.h"
-
 namespace {
 
-constexpr OptionRow rows[] = {
-#define TESSAL_ROW(name, kind, dashValue, groupSize) {"PROGRAM_OPTIONS/" #name, OptionKind::kind, dashValue, groupSize},
-    TESSAL_PROGRAM_OPTIONS(TESSAL_ROW)
-#undef TESSAL_ROW
-};
-static_assert(std::size(rows) == 105, "callers pass row numbers");
+using tESSALNS::OptionRange;
 
 constexpr OptionRange programRange{0, 67};
 constexpr OptionRange eraseRange{67, 81};
@@ -32,58 +22,28 @@ HkString DeviceOptionsMgr::getNumberOfOptionsText() {
 }
 
 void DeviceOptionsMgr::init_attributes() {
-    m_uesSize = 0;
-    appendDescriptions(rows, m_attributes);
+    setUESSize(0);
+    addDescriptions(tESSALNS::programOptionRows);
 }
-
-void DeviceOptionsMgr::init_options() {
-    appendRows(m_attributes);
-}
-
-HkString DeviceOptionsMgr::getAttribute(tESSALNS::PROGRAM_OPTION option) const {
-    return keyOf(m_attributes, option);
-}
-
-bool DeviceOptionsMgr::isEnabled(tESSALNS::PROGRAM_OPTION option) const {
-    return isRowEnabled(m_attributes, option);
-}
-
-bool DeviceOptionsMgr::setEnable(tESSALNS::PROGRAM_OPTION option, bool enabled) {
-    return enableRow(m_attributes, option, enabled);
-}
-
-bool DeviceOptionsMgr::setOption(tESSALNS::PROGRAM_OPTION option, const char* value) {
-    return writeText(m_attributes, option, value);
-}
-
-bool DeviceOptionsMgr::setOption(tESSALNS::PROGRAM_OPTION option, HkString value) {
-    return writeText(m_attributes, option, std::move(value));
-}
-
-bool DeviceOptionsMgr::setOption(tESSALNS::PROGRAM_OPTION option, bool value) {
-    return writeSwitch(m_attributes, option, value);
-}
-
-void DeviceOptionsMgr::commit_options() {}
 
 std::vector<HkString> DeviceOptionsMgr::getProgramOptions() const {
-    return texts(m_attributes, programRange.first, programRange.last);
+    return textsOf(programRange);
 }
 
 std::vector<HkString> DeviceOptionsMgr::getEraseOptions() const {
-    return texts(m_attributes, eraseRange.first, eraseRange.last);
+    return textsOf(eraseRange);
 }
 
 std::vector<HkString> DeviceOptionsMgr::getReadbackOptions() const {
-    return texts(m_attributes, readbackRange.first, readbackRange.last);
+    return textsOf(readbackRange);
 }
 
 std::vector<HkString> DeviceOptionsMgr::getVerifyOptions() const {
-    return texts(m_attributes, verifyRange.first, verifyRange.last);
+    return textsOf(verifyRange);
 }
 
 std::vector<HkString> DeviceOptionsMgr::getCustCodeOptions() const {
-    return texts(m_attributes, custCodeRange.first, custCodeRange.last);
+    return textsOf(custCodeRange);
 }
 
 void DeviceOptionsMgr::clearProgramOptions() {
@@ -96,9 +56,4 @@ void DeviceOptionsMgr::clearEraseOptions() {
 
 void DeviceOptionsMgr::clearReadbackOptions() {
     clearOptions(readbackRange.first, readbackRange.last);
-}
-
-void DeviceOptionsMgr::clearAllOptions() {
-    U_OptionsMgr::clearAllOptions();
-    commit_options();
 }

@@ -17,6 +17,12 @@ std::size_t clamped(int index, std::size_t size) {
     return index < 0 ? 0 : std::min(static_cast<std::size_t>(index), size);
 }
 
+/// The description of a row; null where there is no such row.
+template <class Attributes>
+auto findDescription(Attributes& attributes, int index) -> decltype(attributes.data()) {
+    return isIndexOf(attributes.size(), index) ? &attributes[static_cast<std::size_t>(index)] : nullptr;
+}
+
 }  // namespace
 
 U_AttributePair::U_AttributePair(const char* attribute, bool isBool, const char* dashValue, int groupSize, bool enabled)
@@ -35,8 +41,29 @@ HkString U_OptionsMgr::getAssociatedDeviceText() {
     return "_AssociatedDevice";
 }
 
-void U_OptionsMgr::init_options(Attributes attributes) {
-    appendRows(attributes);
+void U_OptionsMgr::appendDescriptions(const tESSALNS::OptionRow* rows, std::size_t count, Attributes& attributes) {
+    attributes.reserve(attributes.size() + count);
+    std::for_each(rows, rows + count, [&attributes](const tESSALNS::OptionRow& row) {
+        attributes.emplace_back(row.key, row.isSwitch(), row.dashValue, row.groupSize, true);
+    });
+}
+
+HkString U_OptionsMgr::keyOf(const Attributes& attributes, int index) {
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr ? description->m_attribute : HkString();
+}
+
+bool U_OptionsMgr::isRowEnabled(const Attributes& attributes, int index) {
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr && description->m_enabled;
+}
+
+bool U_OptionsMgr::enableRow(Attributes& attributes, int index, bool enabled) {
+    U_AttributePair* const description = findDescription(attributes, index);
+    if (description != nullptr) {
+        description->m_enabled = enabled;
+    }
+    return description != nullptr;
 }
 
 void U_OptionsMgr::appendRows(const Attributes& attributes) {
@@ -73,26 +100,14 @@ bool U_OptionsMgr::setOption(int index, HkString stringValue, bool boolValue, bo
     return true;
 }
 
-bool U_OptionsMgr::setOption(Attributes attributes, int index, HkString value) {
-    return writeText(attributes, index, std::move(value));
-}
-
-bool U_OptionsMgr::setOption(Attributes attributes, int index, const char* value) {
-    return writeText(attributes, index, value);
-}
-
-bool U_OptionsMgr::setOption(Attributes attributes, int index, bool value) {
-    return writeSwitch(attributes, index, value);
-}
-
 bool U_OptionsMgr::writeText(const Attributes& attributes, int index, HkString value) {
-    return isIndexOf(attributes.size(), index) && !attributes[static_cast<std::size_t>(index)].m_isBool &&
-           setOption(index, std::move(value), false, false);
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr && !description->m_isBool && setOption(index, std::move(value), false, false);
 }
 
 bool U_OptionsMgr::writeSwitch(const Attributes& attributes, int index, bool value) {
-    return isIndexOf(attributes.size(), index) && attributes[static_cast<std::size_t>(index)].m_isBool &&
-           setOption(index, HkString(), value, true);
+    const U_AttributePair* const description = findDescription(attributes, index);
+    return description != nullptr && description->m_isBool && setOption(index, HkString(), value, true);
 }
 
 bool U_OptionsMgr::isOptionSet(int index) const {
@@ -109,10 +124,6 @@ bool U_OptionsMgr::getOption(int index) const {
 
 bool U_OptionsMgr::isOptionBool(int index) const {
     return isRow(index) && m_options[static_cast<std::size_t>(index)].m_isBool;
-}
-
-std::vector<HkString> U_OptionsMgr::getOptions(Attributes attributes, int first, int last) const {
-    return texts(attributes, first, last);
 }
 
 std::vector<HkString> U_OptionsMgr::texts(const Attributes& attributes, int first, int last) const {
@@ -167,10 +178,6 @@ void U_OptionsMgr::clearAllOptions() {
     }
 }
 
-void U_OptionsMgr::commit_options(Attributes) {}
-
-void U_OptionsMgr::commit_options(int, Attributes) {}
-
 void U_OptionsMgr::dumpAllOptions() const {
     int index = 0;
     for (const U_OptionsPair& row : m_options) {
@@ -182,3 +189,32 @@ void U_OptionsMgr::dumpAllOptions() const {
         ++index;
     }
 }
+
+// Callers hand their descriptions over by value.
+// NOLINTBEGIN(performance-unnecessary-value-param)
+
+void U_OptionsMgr::init_options(Attributes attributes) {
+    appendRows(attributes);
+}
+
+bool U_OptionsMgr::setOption(Attributes attributes, int index, HkString value) {
+    return writeText(attributes, index, std::move(value));
+}
+
+bool U_OptionsMgr::setOption(Attributes attributes, int index, const char* value) {
+    return writeText(attributes, index, value);
+}
+
+bool U_OptionsMgr::setOption(Attributes attributes, int index, bool value) {
+    return writeSwitch(attributes, index, value);
+}
+
+std::vector<HkString> U_OptionsMgr::getOptions(Attributes attributes, int first, int last) const {
+    return texts(attributes, first, last);
+}
+
+void U_OptionsMgr::commit_options(Attributes) {}
+
+void U_OptionsMgr::commit_options(int, Attributes) {}
+
+// NOLINTEND(performance-unnecessary-value-param)

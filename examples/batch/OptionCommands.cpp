@@ -46,7 +46,7 @@ bool showOptions(Session&, const HkCmdArgs& args) {
         return true;
     }
     DeviceOptionsMgr manager;
-    DeviceOptionReader(args, deviceRows, manager).read(operation->first, operation->last);
+    DeviceOptionReader(args, tESSALNS::programOptionRows, manager).read(operation->first, operation->last);
     const std::vector<HkString> options = (manager.*operation->options)();
     std::string line = "  options:";
     for (const HkString& option : options) {

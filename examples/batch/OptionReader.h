@@ -5,25 +5,6 @@
 
 #include <cstring>
 
-/// One row of an option table, as the library's public lists have it.
-struct OptionRow {
-    bool isSwitch;
-    const char* dashValue;
-    int groupSize;
-};
-
-inline constexpr OptionRow deviceRows[] = {
-#define TESSAL_ROW(name, kind, dashValue, groupSize) {#kind[0] == 'S', dashValue, groupSize},
-    TESSAL_PROGRAM_OPTIONS(TESSAL_ROW)
-#undef TESSAL_ROW
-};
-
-inline constexpr OptionRow modeRows[] = {
-#define TESSAL_ROW(name, kind, dashValue, groupSize) {#kind[0] == 'S', dashValue, groupSize},
-    TESSAL_MODE_OPTIONS(TESSAL_ROW)
-#undef TESSAL_ROW
-};
-
 /// Reads the rows of one operation, in their order, from the arguments of its command.
 ///
 /// Rows that share a dash value are told apart by what stands behind it: a revision's switch by its digit. Where
@@ -31,7 +12,7 @@ inline constexpr OptionRow modeRows[] = {
 template <class Manager, class Option>
 class OptionReader {
 public:
-    OptionReader(const HkCmdArgs& args, const OptionRow* rows, Manager& manager)
+    OptionReader(const HkCmdArgs& args, const tESSALNS::OptionRow* rows, Manager& manager)
         : m_args(args),
           m_rows(rows),
           m_manager(manager),
@@ -49,10 +30,10 @@ private:
     static constexpr const char* revisionSwitch = "-ver";
 
     void readRow(int row) {
-        const OptionRow& description = m_rows[row];
+        const tESSALNS::OptionRow& description = m_rows[row];
         if (description.dashValue[0] == '\0') {
-            setSwitch(row, description.isSwitch && m_emptyLeft-- > 0);
-        } else if (!description.isSwitch) {
+            setSwitch(row, description.isSwitch() && m_emptyLeft-- > 0);
+        } else if (!description.isSwitch()) {
             if (m_args.isGiven(description.dashValue)) {
                 m_manager.setOption(static_cast<Option>(row), m_args.text(description.dashValue));
             }
@@ -93,8 +74,8 @@ private:
 
     void readMembers(int leader, const char* argument, int value) {
         for (int row = leader + 1; row <= leader + m_rows[leader].groupSize; ++row) {
-            const OptionRow& member = m_rows[row];
-            if (member.isSwitch) {
+            const tESSALNS::OptionRow& member = m_rows[row];
+            if (member.isSwitch()) {
                 setSwitch(row, m_args.groupHas(argument, member.dashValue, value));
                 continue;
             }
@@ -111,11 +92,10 @@ private:
     }
 
     const HkCmdArgs& m_args;
-    const OptionRow* m_rows;
+    const tESSALNS::OptionRow* m_rows;
     Manager& m_manager;
     int m_emptyLeft;
     int m_bareSwitchesLeft;
 };
 
 using DeviceOptionReader = OptionReader<DeviceOptionsMgr, tESSALNS::PROGRAM_OPTION>;
-using ModeOptionReader = OptionReader<ModeOptionsMgr, tESSALNS::MODE_OPTION>;

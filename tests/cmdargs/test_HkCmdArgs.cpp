@@ -247,16 +247,6 @@ TEST(HkCmdArgs, CompletesWhatMayComeNext) {
     }
 }
 
-TEST(HkCmdArgs, DescribesTheArgumentsOfAFormat) {
-    const std::vector<HkCmdArgInfo> infos = HkCmdArgs::describe(program);
-    ASSERT_THAT(infos, SizeIs(7));
-    EXPECT_THAT(infos[0].names, ElementsAre("-p", "-position"));
-    EXPECT_TRUE(infos[0].required && infos[0].list && !infos[0].repeated && infos[3].repeated);
-    EXPECT_EQ(infos[0].expected, "an integer from 1 to 255");
-    EXPECT_THAT(infos[2].choices, ElementsAre("mcs", "exo", "tek"));
-    EXPECT_EQ(infos[6].help, "the device's image");
-}
-
 TEST(HkCmdArgs, NearestWordIsWithinAThird) {
     const std::pair<const char*, const char*> cases[] = {
         {"PRGORAM", "program"}, {"prog", nullptr}, {"verfiy", "verify"}, {"erify", "verify"},

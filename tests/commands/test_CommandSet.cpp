@@ -100,17 +100,13 @@ TEST(CommandSet, SplitsAllShortLinesAsTheModelDoes) {
 }
 
 TEST(CommandSet, TakesLongLinesAndManyTokens) {
-    const std::string word(1 << 20, 'w');
-    EXPECT_EQ(split(word.c_str()), Words{word});
-    EXPECT_EQ(split(("\"" + word + " \"").c_str()), Words{word + " "});
-    std::string line;
+    std::string line = std::string(1 << 20, 'w') + " ";
     for (int i = 0; i < 100000; ++i) {
-        line += std::to_string(i) + (i % 2 == 0 ? " " : "\t\"q q\" ");
+        line += std::to_string(i) + "\t\"q q\" ";
     }
     const Words words = split(line.c_str());
-    ASSERT_EQ(words.size(), 150000U);
-    EXPECT_EQ(words.back(), "q q");
-    EXPECT_EQ(words[149998], "99999");
+    ASSERT_EQ(words.size(), 200001U);
+    EXPECT_TRUE(words[0].size() == 1 << 20 && words[199999] == "99999" && words.back() == "q q");
 }
 
 /// The fields, which callers read in place.

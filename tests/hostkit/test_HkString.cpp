@@ -134,6 +134,18 @@ TEST(HkString, OrdersByUnsignedBytesAndThenByLength) {
     EXPECT_NE(HkString(std::string_view("a\0b", 3)), "a");
 }
 
+TEST(HkString, EqualityLooksAtEveryByte) {
+    for (std::size_t length = 1; length <= 40; ++length) {
+        const HkString text(sample(length).c_str());
+        EXPECT_EQ(text, HkString(sample(length).c_str()));
+        for (std::size_t place = 0; place < length; ++place) {
+            std::string other = sample(length);
+            other[place] = '#';
+            EXPECT_NE(text, HkString(other.c_str())) << length << " " << place;
+        }
+    }
+}
+
 TEST(HkString, FindsAndTurnsCharacters) {
     const HkString text("0x1F 0X2f");
     EXPECT_EQ(text.GetIndexOfFirstChar('0', 0), 0U);

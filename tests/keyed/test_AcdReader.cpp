@@ -5,12 +5,10 @@
 
 #include "AcdReader.h"
 #include "KeyedFiles.h"
-#include "MessageRecorder.h"
 
 namespace {
 
 using testing::ElementsAre;
-using testing::IsEmpty;
 using testing::SizeIs;
 
 static_assert(!std::is_copy_constructible_v<AcdReader> && !std::is_copy_assignable_v<AcdReader>);
@@ -55,15 +53,6 @@ TEST_F(Reader, ConvertsValues) {
     EXPECT_EQ(reader.getStringByKey(nullptr), nullptr);
 }
 
-TEST_F(Reader, WithoutADataFileFindsNothingAndSaysSoOnce) {
-    fs::remove(m_directory / "tessal.acd");
-    const MessageRecorder messages;
-    const AcdReader reader;
-    EXPECT_EQ(reader.getStringByKey("NAME"), nullptr);
-    EXPECT_THAT(reader.getLongVectorByKey("LIST"), IsEmpty());
-    EXPECT_THAT(messages.info(), SizeIs(1));
-}
-
 TEST_F(Reader, ListsEndWithTheHighestIndex) {
     std::string list = "[base]\nLIST = 0";
     for (int i = 1; i < 40000; ++i) {
@@ -73,22 +62,6 @@ TEST_F(Reader, ListsEndWithTheHighestIndex) {
     const AcdReader reader;
     EXPECT_THAT(reader.getLongVectorByKey("LIST"), SizeIs(32768));
     EXPECT_STREQ(openTable("tessal.acd")->getstringbykey("LIST", ",", SHRT_MAX, nullptr, 0), "32767");
-}
-
-// The example in docs/data-files.md.
-TEST_F(Reader, TheDocumentedFileReadsAsItLooks) {
-    const std::string text = bytesOf(fs::u8path(TEST_DATA_DIR) / "../../docs/data-files.md");
-    const std::size_t begin = text.find("```\n") + 4;
-    writeFile(m_directory / "tessal.acd", text.substr(begin, text.find("```", begin) - begin));
-    AcdReader reader;
-    EXPECT_EQ(reader.getLongByKey("VERSION"), 3);
-    ProfileKeyTable& table = *reader.getDevkey();
-    EXPECT_STREQ(table.getstringbykey("COMMAND_FORMAT", ":", 1, ",", 2), "-p|-position");
-    EXPECT_STREQ(table.getstringbykey("COMMAND_FORMAT", ":", 2, ",", 2), "");
-    EXPECT_EQ(table.getstringbykey("COMMAND_FORMAT", ":", 3, ",", 0), nullptr);
-    reader.setDevice("xz7s10");
-    EXPECT_THAT(reader.getLongVectorByKey("SECTOR_ADDRESS"), ElementsAre(0, 4096, 8192));
-    EXPECT_EQ(reader.getLongByKey("BIT0_ADDRESS"), 65536);
 }
 
 }  // namespace

@@ -47,16 +47,6 @@ TEST_F(KeyTable, TextsLiveAsLongAsTheTable) {
     EXPECT_STREQ(whole, "1,2");
 }
 
-TEST_F(KeyTable, ReadsNumbersAndGivesZeroWhereThereIsNone) {
-    writeFile(m_directory / "numbers.acd", "[base]\nN = 12, -7,x,,99999999999,5k\n");
-    const auto table = openTable("numbers.acd");
-    const int expected[] = {12, -7, 0, 0, INT_MAX, 5, 0};
-    for (short i = 0; i < 7; ++i) {
-        EXPECT_EQ(table->GetInt32ByKey("N", ",", i, nullptr, 0), expected[i]) << i;
-    }
-    EXPECT_EQ(table->GetInt32ByKey("NONE", nullptr, 0, nullptr, 0), 0);
-}
-
 TEST_F(KeyTable, FindsManyKeysAndTheLastValueOfEach) {
     std::string bytes = "[base]\n";
     for (int i = 0; i < 6000; ++i) {

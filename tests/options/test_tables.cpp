@@ -1,11 +1,8 @@
 // The two option tables: their rows, ranges and clears.
 
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <string>
-#include <tuple>
-#include <type_traits>
+#include <iterator>
 #include <vector>
 
 #include "DeviceOptionsMgr.h"
@@ -14,136 +11,120 @@
 namespace {
 
 using namespace tESSALNS;
-using testing::ElementsAre;
-using testing::IsEmpty;
 
-std::vector<std::string> plain(const std::vector<HkString>& texts) {
-    return {texts.begin(), texts.end()};
-}
+template <class Manager>
+struct Range {
+    std::vector<HkString> (Manager::*read)() const;
+    void (Manager::*clear)();  ///< null where the operation has none
+    int first;
+    int last;
+};
 
-template <class Option>
-Option row(int number) {
-    return static_cast<Option>(number);
-}
+const Range<DeviceOptionsMgr> deviceRanges[] = {
+    {&DeviceOptionsMgr::getProgramOptions, &DeviceOptionsMgr::clearProgramOptions, 0, 67},
+    {&DeviceOptionsMgr::getEraseOptions, &DeviceOptionsMgr::clearEraseOptions, 67, 81},
+    {&DeviceOptionsMgr::getReadbackOptions, &DeviceOptionsMgr::clearReadbackOptions, 81, 83},
+    {&DeviceOptionsMgr::getVerifyOptions, nullptr, 84, 92},
+    {&DeviceOptionsMgr::getCustCodeOptions, nullptr, 94, 102},
+};
+const Range<ModeOptionsMgr> modeRanges[] = {
+    {&ModeOptionsMgr::getCFGenerateOptions, &ModeOptionsMgr::clearCFGenerateOptions, 0, 3},
+    {&ModeOptionsMgr::getMPMGenerateOptions, &ModeOptionsMgr::clearMPMGenerateOptions, 4, 8},
+    {&ModeOptionsMgr::getPFFGenerateOptions, &ModeOptionsMgr::clearPFFGenerateOptions, 9, 18},
+};
 
-/// Turns every row on, switches by true and text options by a text.
+/// Turns a row on, a switch by true and a text option by a text; the other way is refused.
 template <class Manager, class Option>
-void setAll(Manager& manager, int count) {
-    for (int i = 0; i < count; ++i) {
-        EXPECT_NE(manager.setOption(row<Option>(i), true), manager.setOption(row<Option>(i), "T"));
-    }
+void turnOn(Manager& manager, Option option) {
+    EXPECT_NE(manager.setOption(option, true), manager.setOption(option, "T")) << int{option};
 }
 
-TEST(DeviceOptionsMgr, RowsAndTheirNumbersArePartOfTheInterface) {
-    DeviceOptionsMgr manager;
-    EXPECT_STREQ(manager.getNumberOfOptionsText(), "NumberOfDeviceOptions");
-    EXPECT_STREQ(manager.getAttribute(PROGRAM_MAX_OPTIONS), "PROGRAM_OPTIONS/PROGRAM_MAX_OPTIONS");
-    EXPECT_FALSE(manager.getOptionsModified());
+/// Resets by @p clear, after which exactly the rows of the range are off and what is no option stays.
+template <class Option, class Manager>
+void expectClears(void (Manager::*clear)(), int first, int last) {
+    Manager manager;
+    const int rows = manager.getNumberOptions();
+    for (int row = 0; row < rows; ++row) {
+        turnOn(manager, Option(row));
+    }
+    manager.setEnable(Option(1), false);
+    manager.setOptionsModified(true);
+    (manager.*clear)();
+    for (int row = 0; row < rows; ++row) {
+        const bool isOn = manager.getOption(row) || !manager.getOptionString(row).IsEmpty();
+        EXPECT_EQ(isOn, row < first || row >= last) << row;
+    }
+    EXPECT_TRUE(!manager.isEnabled(Option(1)) && manager.getOptionsModified());
+}
+
+template <class Option, class Manager, std::size_t rangeCount, std::size_t rowCount>
+void expectRanges(const Range<Manager> (&ranges)[rangeCount], const OptionRow (&rows)[rowCount]) {
+    const int count = static_cast<int>(rowCount);
+    for (const auto& [read, clear, first, last] : ranges) {
+        SCOPED_TRACE(first);
+        int membersLeft = 0;
+        for (int row = 0; row < count; ++row) {
+            const bool isMember = membersLeft > 0;
+            membersLeft = isMember ? membersLeft - 1 : rows[row].groupSize;
+            Manager manager;
+            turnOn(manager, Option(row));
+            EXPECT_EQ((manager.*read)().empty(), isMember || row < first || row >= last) << rows[row].key;
+        }
+        if (clear != nullptr) {
+            expectClears<Option>(clear, first, last);
+        }
+    }
+    expectClears<Option, Manager>(&Manager::clearAllOptions, 0, count);
+}
+
+TEST(OptionTables, ReadersAndClearsReachTheirRangeAlone) {
+    expectRanges<PROGRAM_OPTION>(deviceRanges, programOptionRows);
+    expectRanges<MODE_OPTION>(modeRanges, modeOptionRows);
+}
+
+TEST(OptionTables, RowNumbersAndLayoutArePartOfTheInterface) {
+    const int numbers[] = {USERCODE,
+                           CMGR_PROGRAM_MAX_OPTION,
+                           REV0_CHECKED,
+                           REV3_CUSTCODE,
+                           PROGRAM_MAX_OPTIONS,
+                           ERASE_MAX_OPTIONS,
+                           VERIFY_REV0,
+                           VERIFY_ALL,
+                           CUSTCODE_REV0,
+                           LOAD_REV};
+    const int expected[] = {9, 24, 25, 56, 67, 81, 84, 92, 94, 104};
+    EXPECT_TRUE(std::equal(std::begin(numbers), std::end(numbers), std::begin(expected)));
+    constexpr std::size_t list = sizeof(std::vector<int>);
+    static_assert(sizeof(PROGRAM_OPTION) == 4 && sizeof(MODE_OPTION) == 4);
+    static_assert(sizeof(DeviceOptionsMgr) == sizeof(void*) + list + 8 + 2 * list + 8);
+    static_assert(sizeof(ModeOptionsMgr) == sizeof(void*) + list + 2 * list + 8);
+    DeviceOptionsMgr device;
     int switches = 0;
-    for (int i = 0; i < manager.getNumberOptions(); ++i) {
-        EXPECT_TRUE(manager.isEnabled(row<PROGRAM_OPTION>(i)) && !manager.getOption(i)) << i;
-        switches += manager.isOptionBool(i) ? 1 : 0;
+    for (int row = 0; row < device.getNumberOptions(); ++row) {
+        switches += device.isOptionBool(row) ? 1 : 0;
     }
     EXPECT_EQ(switches, 92);
-    EXPECT_THAT((std::vector<int>{USERCODE, CMGR_PROGRAM_MAX_OPTION, REV0_CHECKED, REV3_CUSTCODE, PROGRAM_MAX_OPTIONS,
-                                  ERASE_MAX_OPTIONS, VERIFY_REV0, VERIFY_ALL, CUSTCODE_REV0, CUSTCODE_ALL, LOAD_REV}),
-                ElementsAre(9, 24, 25, 56, 67, 81, 84, 92, 94, 102, 104));
-    static_assert(std::is_same_v<std::underlying_type_t<PROGRAM_OPTION>, std::int32_t>);
+    EXPECT_STREQ(device.getNumberOfOptionsText(), "NumberOfDeviceOptions");
+    EXPECT_STREQ(device.getAttribute(PROGRAM_MAX_OPTIONS), "PROGRAM_OPTIONS/PROGRAM_MAX_OPTIONS");
+    ModeOptionsMgr mode;
+    EXPECT_STREQ(mode.getNumberOfOptionsText(), "NumberOfModeOptions");
+    EXPECT_STREQ(mode.getAttribute(IDCODE_LOOP_COUNT), "MODE_OPTIONS/IDCODE_LOOP_COUNT");
 }
 
-TEST(DeviceOptionsMgr, ReadersGiveTheirRangeInRowOrder) {
-    DeviceOptionsMgr manager;
-    manager.setOption(USERCODE, "1234");
-    manager.setOption(VERIFY, true);
-    manager.setOption(ERASE_B4_PROGRAMMING, true);
-    for (PROGRAM_OPTION option : {REV1_CHECKED, REV1_VALUE, REV1_RP, REV1_FRC, REV2_WP}) {
-        manager.setOption(option, true);
-    }
-    manager.setOption(REV1_CUSTCODE, HkString("1A2B"));
-    manager.setOption(CLOCK_FREQUENCY, true);
-    manager.setOption(FREQ_20MHZ, true);
-    EXPECT_THAT(plain(manager.getProgramOptions()),
-                ElementsAre("-e", "-v", "-u", "1234", "-ver", "1 rp frc customercode:1A2B", "-clkFreq", "20"));
-    EXPECT_THAT(manager.getEraseOptions(), IsEmpty());
-    manager.setOption(PROGRAM_MAX_OPTIONS, true);
-    manager.setOption(ERASE_REV2, true);
-    manager.setOption(ERASE_REV2_VALUE, true);
-    EXPECT_THAT(plain(manager.getEraseOptions()), ElementsAre("", "-ver", "2"));
-}
-
-TEST(DeviceOptionsMgr, FullRangesHoldTheRowsThatBelongToThem) {
-    DeviceOptionsMgr manager;
-    setAll<DeviceOptionsMgr, PROGRAM_OPTION>(manager, 105);
-    EXPECT_EQ(manager.getProgramOptions().size(), 67U - 4 * 6 + 7);
-    EXPECT_THAT(plain(manager.getEraseOptions()), ElementsAre("", "", "-o", "-ver", "0", "-ver", "1", "-ver", "2",
-                                                              "-ver", "3", "", "-turbo", "-revisionSelection"));
-    EXPECT_THAT(plain(manager.getReadbackOptions()), ElementsAre("", "-file", "T"));
-    for (const auto& reader : {&DeviceOptionsMgr::getVerifyOptions, &DeviceOptionsMgr::getCustCodeOptions}) {
-        EXPECT_THAT(plain((manager.*reader)()), ElementsAre("-ver", "0", "-ver", "1", "-ver", "2", "-ver", "3"));
-    }
-}
-
-TEST(DeviceOptionsMgr, ClearsResetTheirRangeAlone) {
-    const std::tuple<void (DeviceOptionsMgr::*)(), int, int> cases[] = {
-        {&DeviceOptionsMgr::clearProgramOptions, 0, 67},
-        {&DeviceOptionsMgr::clearEraseOptions, 67, 81},
-        {&DeviceOptionsMgr::clearReadbackOptions, 81, 83},
-        {&DeviceOptionsMgr::clearAllOptions, 0, 105}};
-    for (const auto& [clear, first, last] : cases) {
-        SCOPED_TRACE(first);
-        DeviceOptionsMgr manager;
-        setAll<DeviceOptionsMgr, PROGRAM_OPTION>(manager, 105);
-        manager.setEnable(VERIFY, false);
-        manager.setUESSize(7);
-        manager.setOptionsModified(true);
-        (manager.*clear)();
-        for (int i = 0; i < 105; ++i) {
-            const bool given = manager.getOption(i) || !manager.getOptionString(i).IsEmpty();
-            EXPECT_EQ(given, i < first || i >= last) << i;
-        }
-        EXPECT_TRUE(!manager.isEnabled(VERIFY) && manager.getUESSize() == 7 && manager.getOptionsModified());
-    }
-}
-
-TEST(DeviceOptionsMgr, WrongRowsAndKindsAreRefused) {
+TEST(OptionTables, RowsOutsideAreRefused) {
     DeviceOptionsMgr manager;
     for (int number : {-1, 105, 1 << 30}) {
-        const auto option = row<PROGRAM_OPTION>(number);
-        EXPECT_FALSE(manager.isEnabled(option));
-        EXPECT_FALSE(manager.setEnable(option, true));
-        EXPECT_FALSE(manager.setOption(option, true));
-        EXPECT_FALSE(manager.setOption(option, "x"));
+        const auto option = PROGRAM_OPTION(number);
+        EXPECT_FALSE(manager.isEnabled(option) || manager.setEnable(option, true));
+        EXPECT_FALSE(manager.setOption(option, true) || manager.setOption(option, "x"));
         EXPECT_TRUE(manager.getAttribute(option).IsEmpty());
     }
     EXPECT_TRUE(manager.setOption(USERCODE, static_cast<const char*>(nullptr)));
-    manager.setOption(VERIFY, true);
+    manager.setUESSize(7);
     manager.init_attributes();
-    EXPECT_EQ(manager.getNumberOptions(), 210);
-    manager.commit_options();
-    EXPECT_THAT(plain(manager.getProgramOptions()), ElementsAre("-v"));
-    EXPECT_FALSE(manager.setOption(row<PROGRAM_OPTION>(105), true)) << "a description without a value row";
-}
-
-TEST(ModeOptionsMgr, HasThreeRangesAndALoopCount) {
-    ModeOptionsMgr manager;
-    EXPECT_STREQ(manager.getNumberOfOptionsText(), "NumberOfModeOptions");
-    EXPECT_STREQ(manager.getAttribute(row<MODE_OPTION>(19)), "MODE_OPTIONS/IDCODE_LOOP_COUNT");
-    setAll<ModeOptionsMgr, MODE_OPTION>(manager, 20);
-    EXPECT_THAT(plain(manager.getCFGenerateOptions()), ElementsAre("", "-active", "T", "-path", "T"));
-    EXPECT_THAT(plain(manager.getMPMGenerateOptions()), ElementsAre("", "-path", "T", "-output", "T", "-compressed"));
-    EXPECT_THAT(plain(manager.getPFFGenerateOptions()),
-                ElementsAre("", "-path", "T", "-output", "T", "-compressed", "-format", "T", "-fillValue", "T",
-                            "-disableswap", "-generic", "-multiboot"));
-    manager.clearMPMGenerateOptions();
-    EXPECT_THAT(manager.getMPMGenerateOptions(), IsEmpty());
-    EXPECT_EQ(manager.getCFGenerateOptions().size(), 5U);
-    manager.clearCFGenerateOptions();
-    manager.clearPFFGenerateOptions();
-    EXPECT_THAT(manager.getPFFGenerateOptions(), IsEmpty());
-    EXPECT_STREQ(manager.getOptionString(IDCODE_LOOP_COUNT), "T");
-    manager.clearAllOptions();
-    EXPECT_STREQ(manager.getOptionString(IDCODE_LOOP_COUNT), "");
-    EXPECT_FALSE(manager.isEnabled(row<MODE_OPTION>(-1)) || manager.setEnable(row<MODE_OPTION>(20), true));
+    EXPECT_TRUE(manager.getNumberOptions() == 210 && manager.getUESSize() == 0);
+    EXPECT_FALSE(manager.setOption(PROGRAM_OPTION(105), true)) << "a description without a value row";
 }
 
 }  // namespace

@@ -79,7 +79,6 @@ TEST(Preference, SettingStoresUpperCaseAndRefusesTheRest) {
                                              " is not a legal preference value for .\n",
                                              " is not a legal preference value for Mixed.\n"));
     TessalPreference::removePreferenceObject();
-    TessalPreference::removePreferenceObject();
     TessalPreference& again = *TessalPreference::getPreferenceObject();
     EXPECT_EQ(again.getPreferenceValue(level), 3) << "the table outlives the object";
     EXPECT_TRUE(again.setPreference(automatic, "true") && again.setPreference(level, "1") &&
