@@ -118,9 +118,10 @@ public:
         return static_cast<Pipe>(socket.release());
     }
 
+    // Whoever reads wants all the bytes: waiting for all of them wakes it once for a block, not for each part of it.
     std::int64_t read(Pipe pipe, char* data, int length) override {
         const ssize_t moved =
-            retried([&] { return ::recv(descriptor(pipe), data, static_cast<std::size_t>(length), 0); });
+            retried([&] { return ::recv(descriptor(pipe), data, static_cast<std::size_t>(length), MSG_WAITALL); });
         return closedIsBroken(moved);
     }
 
@@ -150,7 +151,7 @@ private:
 
 }  // namespace
 
-PipeHost& realPipeHost() {
+PipeHost& pipeHost() {
     static PosixPipeHost& host = *new PosixPipeHost;
     return host;
 }
