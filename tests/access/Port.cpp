@@ -24,6 +24,10 @@ const std::map<std::string, Operation>& operations() {
     return table;
 }
 
+const Role portUser{"port user", &usePort};
+
+}  // namespace
+
 int usePort(const RoleArguments& arguments) {
     Access access(std::stoi(arguments.at(0)), static_cast<Access::ACCESS_TYPE>(std::stoi(arguments.at(1))));
     std::cout << "open" << std::endl;
@@ -32,10 +36,6 @@ int usePort(const RoleArguments& arguments) {
     }
     return 0;
 }
-
-const Role portUser{"port user", &usePort};
-
-}  // namespace
 
 int freshPort() {
     // A range of a thousand ids for each microsecond at which a test may start.

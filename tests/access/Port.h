@@ -2,6 +2,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 #include "Access.h"
 #include "host/ChildProcess.h"
@@ -23,6 +24,12 @@ public:
 private:
     ChildProcess m_process;
 };
+
+/// What the process does: a role with a port and a type.
+int usePort(const std::vector<std::string>& arguments);
+
+/// True if the machine holds nothing of the semaphore of a SHARE.
+bool isNothingLeft(int port);
 
 /// True if a new Access finds the port free and can take it, as it must where nobody else is.
 bool isFree(int port);

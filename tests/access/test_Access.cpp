@@ -230,6 +230,30 @@ TEST(AccessProcesses, KilledClientsKeepTheirSlotsUntilTheLastOneGoes) {
     EXPECT_EQ(Access(port, Access::COUNT).getNormalizedCount(), 0);
 }
 
+// The role "stepper" opens, locks, gives back and closes a port, and is killed at one of its calls of the host.
+TEST(AccessSteps, KilledAtEachHostCallLeavesTheCountToThoseWhoRemainOrAFreshPort) {
+    for (const bool isKept : {false, true}) {
+        const int port = freshPort();
+        bool gotThrough = false;
+        for (int step = 1; !gotThrough && step < 100; ++step) {
+            SCOPED_TRACE("step " + std::to_string(step) + (isKept ? " beside a holder" : ""));
+            std::vector<Access> keepers;
+            if (isKept) {
+                keepers.emplace_back(port, Access::SHARE);
+                ASSERT_TRUE(keepers.front().lock());
+            }
+            ChildProcess child("stepper", {"kill", std::to_string(step), std::to_string(port)});
+            gotThrough = child.wait() == 0;
+            ASSERT_EQ(isFree(port), !isKept);
+            ASSERT_TRUE(!isKept || keepers.front().unlock());
+            ASSERT_TRUE(isFree(port));
+            keepers.clear();
+            ASSERT_TRUE(isNothingLeft(port));
+        }
+        EXPECT_TRUE(gotThrough);
+    }
+}
+
 // Not among the cases for ThreadSanitizer: it does not see that the kernel's semaphore keeps the openers apart.
 TEST(Access, ManyAtOnceOpenAndCloseOneName) {
     const int port = freshPort();
@@ -252,7 +276,7 @@ TEST(Access, ManyAtOnceOpenAndCloseOneName) {
         thread.join();
     }
     EXPECT_EQ(faults, 0);
-    EXPECT_EQ(NamedSemaphore::open(("CableSharing" + std::to_string(port)).c_str()), nullptr);
+    EXPECT_TRUE(isNothingLeft(port));
 }
 
 TEST(AccessThreads, NeverReleasePastTheMaximum) {
