@@ -10,8 +10,8 @@
 /// An id of its own at each call.
 int freshPort();
 
-/// A process with one Access, which does what it is told by the lines "lock", "unlock", "clean", "inc", "dec" and
-/// "clients", and answers each with its result. It ends in order at "end".
+/// A process with one Access, which does what it is told by the lines "lock", "dec" and "clients", and answers each
+/// with its result. It ends in order at "end".
 class PortUser {
 public:
     explicit PortUser(int port, Access::ACCESS_TYPE type = Access::SHARE);
@@ -19,7 +19,6 @@ public:
     int ask(const char* operation) { return std::stoi(m_process.ask(operation)); }
     void kill() { m_process.kill(); }
     int end();
-    ChildProcess& process() { return m_process; }
 
 private:
     ChildProcess m_process;

@@ -17,6 +17,21 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::StartsWith;
 
+namespace {
+
+template <class Body>
+void inThreads(Body body) {
+    std::vector<std::thread> threads;
+    for (int i = 0; i < 4; ++i) {
+        threads.emplace_back(body);
+    }
+    for (std::thread& thread : threads) {
+        thread.join();
+    }
+}
+
+}  // namespace
+
 TEST(AccessId, HasAFamilyForEachPortName) {
     struct {
         const char* name;
@@ -259,22 +274,16 @@ TEST(Access, ManyAtOnceOpenAndCloseOneName) {
     const int port = freshPort();
     std::atomic<int> holders{0};
     std::atomic<int> faults{0};
-    std::vector<std::thread> threads;
-    for (int i = 0; i < 4; ++i) {
-        threads.emplace_back([&] {
-            for (int round = 0; round < 300; ++round) {
-                Access access(port, Access::SHARE);
-                if (access.lock()) {
-                    faults += ++holders != 1;
-                    --holders;
-                    faults += !access.unlock();
-                }
+    inThreads([&] {
+        for (int round = 0; round < 300; ++round) {
+            Access access(port, Access::SHARE);
+            if (access.lock()) {
+                faults += ++holders != 1;
+                --holders;
+                faults += !access.unlock();
             }
-        });
-    }
-    for (std::thread& thread : threads) {
-        thread.join();
-    }
+        }
+    });
     EXPECT_EQ(faults, 0);
     EXPECT_TRUE(isNothingLeft(port));
 }
@@ -284,21 +293,15 @@ TEST(AccessThreads, NeverReleasePastTheMaximum) {
     Access observer(port, Access::COUNT);
     std::atomic<int> given{0};
     std::atomic<int> taken{0};
-    std::vector<std::thread> threads;
-    for (int i = 0; i < 3; ++i) {
-        threads.emplace_back([&] {
-            Access access(port, Access::COUNT);
-            PlatformSemaphore* const units = NamedSemaphore::open(("CableShareCount" + std::to_string(port)).c_str());
-            for (int round = 0; round < 10000; ++round) {
-                given += NamedSemaphore::release(units, 1, nullptr);
-                taken += access.decCount();
-            }
-            NamedSemaphore::close(units);
-        });
-    }
-    for (std::thread& thread : threads) {
-        thread.join();
-    }
+    inThreads([&] {
+        Access access(port, Access::COUNT);
+        PlatformSemaphore* const units = NamedSemaphore::open(("CableShareCount" + std::to_string(port)).c_str());
+        for (int round = 0; round < 10000; ++round) {
+            given += NamedSemaphore::release(units, 1, nullptr);
+            taken += access.decCount();
+        }
+        NamedSemaphore::close(units);
+    });
     EXPECT_EQ(observer.getNormalizedCount(), taken - given);
     EXPECT_GE(taken - given, 0);
     EXPECT_LE(taken - given, 5);
