@@ -32,16 +32,20 @@ public:
     void reset() { m_position = 0; }
 
     void writeInt(int value) {
+        int place = m_position;  // in a register: bytes stored may alias the fields, for all that the compiler knows
         if (hasSpace(WireForm::intSize)) {
-            WireForm::storeInt(m_data + m_position, value);
-            m_position += WireForm::intSize;
+            WireForm::storeInt(m_data + place, value);
+            place += WireForm::intSize;
         }
+        m_position = place;
     }
     void writeBool(bool value) { writeByte(value ? 1 : 0); }
     void writeByte(char value) {
+        int place = m_position;
         if (hasSpace(1)) {
-            m_data[m_position++] = value;
+            m_data[place++] = value;
         }
+        m_position = place;
     }
     /// Writes @p length bytes, which may be the buffer's own; nothing for null or a length below 1.
     void write(const char* data, int length);
@@ -60,14 +64,10 @@ public:
     char readByte() { return holds(1) ? m_data[m_position++] : '\0'; }
 
 private:
-    bool holds(int size) const { return m_capacity - m_position >= size; }
-    bool hasSpace(int size) {
-        if (!holds(size)) {
-            checkBufferSpace(size);
-        }
-        return holds(size);
-    }
-    void checkBufferSpace(int requested);
+    bool holds(int size) const { return m_position <= m_capacity - size; }
+    bool hasSpace(int size) { return holds(size) || checkBufferSpace(size); }
+    /// Grows, for a write that does not fit; false where that fails.
+    bool checkBufferSpace(int requested);
     std::ptrdiff_t placeInside(const char* data) const;
 
     int m_position = 0;

@@ -2,6 +2,8 @@
 /// The text field of records.
 #pragma once
 
+#include <string_view>
+
 #include "Streamable.h"
 
 /// A text that streams as its length, a line feed, its characters and a line feed.
@@ -30,7 +32,7 @@ public:
     void writeStream(std::ostream& out) override;
 
 private:
-    void adopt(char* text);
+    void assign(std::string_view text);
 
     char* m_text = nullptr;
 };

@@ -36,12 +36,7 @@ public:
     virtual int lastError() = 0;
 };
 
-/// The one in use.
-PipeHost& pipeHost();
-/// Puts another one in its place; null restores the host's own. Not while pipes are in use.
-void replacePipeHost(PipeHost* host);
-
 /// The host's own.
-PipeHost& realPipeHost();
+PipeHost& pipeHost();
 
 }  // namespace platform

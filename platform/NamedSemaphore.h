@@ -28,9 +28,10 @@ enum Failure : int { notFound = 2, invalidHandle = 6, invalidParameter = 87, too
 /// Gives a handle on the living semaphore of this name, or null where there is none.
 PlatformSemaphore* open(const char* name);
 
-/// Makes the semaphore, with 0 <= initial <= maximum and maximum > 0. Where one of the name lives already, gives a
-/// handle on that one with its count and maximum. Null on failure; explainLastError() says why.
-PlatformSemaphore* create(const char* name, std::int32_t initial, std::int32_t maximum);
+/// Gives a handle on the living semaphore of this name, with its count and maximum; where there is none, makes it, with
+/// 0 <= initial <= maximum and maximum > 0. @p wasThere, unless null, tells which. Null on failure; explainLastError()
+/// says why.
+PlatformSemaphore* create(const char* name, std::int32_t initial, std::int32_t maximum, bool* wasThere = nullptr);
 
 /// Gives a second handle on the semaphore of @p handle, to be closed by itself; null on failure.
 PlatformSemaphore* duplicate(PlatformSemaphore* handle);

@@ -63,17 +63,14 @@ unsigned long idOf(const PlatformSemaphore* semaphore) {
 }
 
 PlatformSemaphore* openOrCreate(const char* name, std::int32_t units) {
-    PlatformSemaphore* semaphore = NamedSemaphore::open(name);
-    if (semaphore != nullptr) {
-        HkMessageManager::debugStub(" Reusing semaphore, id=0x%08lX.\n", idOf(semaphore));
-        return semaphore;
-    }
-    semaphore = NamedSemaphore::create(name, units, units);
+    bool wasThere = false;
+    PlatformSemaphore* const semaphore = NamedSemaphore::create(name, units, units, &wasThere);
     if (semaphore == nullptr) {
         const char* const reason = NamedSemaphore::explainLastError();
         origin.report().issueInfo("Semaphore %s is not available: %s.\n", name, reason);
     }
-    HkMessageManager::debugStub(" Creating semaphore, id=0x%08lX.\n", idOf(semaphore));
+    HkMessageManager::debugStub(wasThere ? " Reusing semaphore, id=0x%08lX.\n" : " Creating semaphore, id=0x%08lX.\n",
+                                idOf(semaphore));
     return semaphore;
 }
 

@@ -8,6 +8,7 @@
 #include "HkStr.h"
 #include "s/CableInfoOrigin.h"
 #include "s/RecordStream.h"
+#include "s/RecordWriter.h"
 
 namespace {
 
@@ -99,12 +100,12 @@ void CableInfo::readStream(std::istream& in) {
 }
 
 void CableInfo::writeStream(std::ostream& out) {
-    RecordWriter record;
+    RecordWriter record(out);
     record.addText(m_portName.getString());
     record.addInt(m_portNumber);
     record.addInt(m_portSpeed);
     record.addText(m_cableName.getString());
-    record.writeTo(out);
+    record.finish();
 }
 
 void CableInfo::setPortName(const char* name) {

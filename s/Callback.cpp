@@ -4,6 +4,7 @@
 
 #include "s/ProgressClock.h"
 #include "s/RecordStream.h"
+#include "s/RecordWriter.h"
 
 namespace {
 
@@ -60,12 +61,12 @@ void Callback::readStream(std::istream& in) {
 }
 
 void Callback::writeStream(std::ostream& out) {
-    RecordWriter record;
+    RecordWriter record(out);
     record.addInt(m_totalCount);
     record.addInt(m_currentCount);
     record.addInt(m_progressStatus);
     record.addLine(m_callbackText);
-    record.writeTo(out);
+    record.finish();
 }
 
 bool CallbackFunction::callFunction(Callback& record) {

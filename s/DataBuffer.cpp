@@ -77,19 +77,17 @@ std::ptrdiff_t DataBuffer::placeInside(const char* data) const {
     return inside ? data - m_data : -1;
 }
 
-void DataBuffer::checkBufferSpace(int requested) {
+bool DataBuffer::checkBufferSpace(int requested) {
     const std::int64_t needed = std::int64_t{m_position} + requested;
-    if (needed <= m_capacity) {
-        return;
-    }
     const std::int64_t capacity = std::int64_t{m_capacity} + requested + growthMargin;
     void* const grown =
         capacity <= std::numeric_limits<int>::max() ? hk_realloc(m_data, static_cast<std::size_t>(capacity)) : nullptr;
     if (grown == nullptr) {
         HkMessageManager::debugStub("Error reallocating space in DataBuffer.\n");
-        return;
+        return false;
     }
     m_data = static_cast<char*>(grown);
     m_capacity = static_cast<int>(capacity);
     HkMessageManager::debugStub("New buffer size = %d. Requested size = %d.\n", m_capacity, static_cast<int>(needed));
+    return true;
 }

@@ -1,9 +1,11 @@
 #include "NetString.h"
 
+#include <cstring>
 #include <string>
+#include <utility>
 
-#include "HkStr.h"
 #include "s/RecordStream.h"
+#include "s/RecordWriter.h"
 
 // The copy's id is 0.
 NetString::NetString(const NetString& other) : Streamable() {  // NOLINT(bugprone-copy-constructor-init)
@@ -22,23 +24,29 @@ NetString::~NetString() {
 }
 
 void NetString::setString(const char* text) {
-    adopt(HkStr::Dup(text));
+    assign(text != nullptr ? text : "");
 }
 
-void NetString::adopt(char* text) {
-    delete[] m_text;
-    m_text = text;
+void NetString::assign(std::string_view text) {
+    char* former = nullptr;
+    if (m_text == nullptr || text.size() > std::strlen(m_text)) {
+        former = std::exchange(m_text, new char[text.size() + 1]);
+    }
+    std::memmove(m_text, text.data(), text.size());
+    m_text[text.size()] = '\0';
+    delete[] former;  // only now, for the text may be a piece of it
 }
 
 void NetString::readStream(std::istream& in) {
-    std::string text;
-    if (readRecordText(in, text)) {
-        setString(text.c_str());
+    std::string memory;
+    std::string_view text;
+    if (readRecordText(in, memory, text)) {
+        assign(text);
     }
 }
 
 void NetString::writeStream(std::ostream& out) {
-    RecordWriter record;
+    RecordWriter record(out);
     record.addText(m_text);
-    record.writeTo(out);
+    record.finish();
 }

@@ -1,106 +1,65 @@
 #include "s/RecordStream.h"
 
-#include <charconv>
-#include <cstdint>
+#include <algorithm>
 #include <istream>
-#include <limits>
-#include <ostream>
-#include <string_view>
 
-#include "HkStr.h"
+#include "s/ReadyText.h"
+#include "s/RecordField.h"
 
 namespace {
 
-using Traits = std::char_traits<char>;
-
-bool isEnd(Traits::int_type c) {
-    return Traits::eq_int_type(c, Traits::eof());
+const char* skipSpace(const char* next, const char* end) {
+    while (next != end && RecordField::isSpace(*next)) {
+        ++next;
+    }
+    return next;
 }
 
-bool isSpace(Traits::int_type c) {
-    return c == ' ' || (c >= '\t' && c <= '\r');
-}
+// Most fields lie ready in the stream's buffer together with the character behind them. These take such a field, or
+// nothing of any other.
 
-/// Skips white space. False, with end and fail state, where nothing follows it or the stream was not good.
-bool openField(std::istream& in) {
-    const std::istream::sentry ready(in, true);
-    if (!ready) {
+bool takeReadyInt(std::streambuf& buffer, int& value) {
+    constexpr std::ptrdiff_t safeDigits = 9;
+    const ReadyText ready(buffer);
+    const char* next = skipSpace(ready.begin(), ready.end());
+    const bool isNegative = next != ready.end() && *next == '-';
+    const char* const digits = isNegative ? next + 1 : next;
+    const char* const limit = digits + std::min(ready.end() - digits, safeDigits);
+    int magnitude = 0;
+    for (next = digits; next != limit && RecordField::isDigit(*next); ++next) {
+        magnitude = magnitude * 10 + (*next - '0');
+    }
+    if (next == digits || next == ready.end() || RecordField::isDigit(*next)) {
         return false;
     }
-    std::streambuf& buffer = *in.rdbuf();
-    Traits::int_type c = buffer.sgetc();
-    while (isSpace(c)) {
-        c = buffer.snextc();
-    }
-    if (isEnd(c)) {
-        in.setstate(std::ios_base::eofbit | std::ios_base::failbit);
-        return false;
-    }
+    value = isNegative ? -magnitude : magnitude;
+    ready.takeUpTo(next);
     return true;
 }
 
-bool limitTo32Bits(std::int64_t wide, int& value) {
-    constexpr std::int64_t least = std::numeric_limits<int>::min();
-    constexpr std::int64_t most = std::numeric_limits<int>::max();
-    value = static_cast<int>(wide < least ? least : wide > most ? most : wide);
-    return wide >= least && wide <= most;
-}
-
-/// Takes the digits at the front; false where there are none.
-bool takeDigits(std::streambuf& buffer, std::int64_t& magnitude) {
-    constexpr std::int64_t beyond32Bits = std::int64_t{1} << 40;
-    bool any = false;
-    Traits::int_type c = buffer.sgetc();
-    for (; HkStr::IsDigit(c) != 0; c = buffer.snextc()) {
-        any = true;
-        magnitude = magnitude < beyond32Bits ? magnitude * 10 + (c - '0') : magnitude;
+bool takeReadyText(std::streambuf& buffer, int length, std::string_view& text) {
+    const ReadyText ready(buffer);
+    const char* const begin = skipSpace(ready.begin(), ready.end());
+    const char* const limit = begin + std::min<std::ptrdiff_t>(length, ready.end() - begin);
+    const char* next = begin;
+    while (next != limit && !RecordField::isSpace(*next)) {
+        ++next;
     }
-    return any;
+    if (next == ready.end()) {
+        return false;
+    }
+    text = std::string_view(begin, static_cast<std::size_t>(next - begin));
+    ready.takeUpTo(next);
+    return true;
 }
 
 }  // namespace
 
-void RecordWriter::addInt(int value) {
-    char digits[16];
-    const std::to_chars_result end = std::to_chars(digits, digits + sizeof digits, value);
-    *end.ptr = '\n';
-    m_form.append(digits, end.ptr + 1);
-}
-
-void RecordWriter::addText(const char* text) {
-    const std::string_view view(text != nullptr ? text : "");
-    addInt(static_cast<int>(view.size()));
-    addLine(view.data());
-}
-
-void RecordWriter::addLine(const char* text) {
-    m_form.append(text);
-    m_form.push_back('\n');
-}
-
-void RecordWriter::writeTo(std::ostream& out) const {
-    out.write(m_form.data(), static_cast<std::streamsize>(m_form.size()));
-    out.width(0);
-}
-
 bool readRecordInt(std::istream& in, int& value) {
-    if (!openField(in)) {
-        return false;
-    }
-    std::streambuf& buffer = *in.rdbuf();
-    const Traits::int_type sign = buffer.sgetc();
-    if (sign == '-' || sign == '+') {
-        buffer.sbumpc();
-    }
-    std::int64_t magnitude = 0;
-    const bool any = takeDigits(buffer, magnitude);
-    const bool fits = limitTo32Bits(sign == '-' ? -magnitude : magnitude, value);
-    in.setstate((isEnd(buffer.sgetc()) ? std::ios_base::eofbit : std::ios_base::goodbit) |
-                (any && fits ? std::ios_base::goodbit : std::ios_base::failbit));
-    return any && fits;
+    return (in.good() && in.tie() == nullptr && takeReadyInt(*in.rdbuf(), value)) || RecordField::readInt(in, value);
 }
 
-bool readRecordText(std::istream& in, std::string& text) {
+bool readRecordText(std::istream& in, std::string& memory, std::string_view& text) {
     int length = 0;
     if (!readRecordInt(in, length)) {
         return false;
@@ -110,21 +69,15 @@ bool readRecordText(std::istream& in, std::string& text) {
         return false;
     }
     if (length == 0) {
-        text.clear();
+        text = "";
         return true;
     }
-    if (!openField(in)) {
+    if (in.good() && takeReadyText(*in.rdbuf(), length, text)) {
+        return true;
+    }
+    if (!RecordField::readText(in, length, memory)) {
         return false;
     }
-    text.clear();
-    std::streambuf& buffer = *in.rdbuf();
-    Traits::int_type c = buffer.sgetc();
-    for (int taken = 0; taken < length && !isEnd(c) && !isSpace(c); ++taken) {
-        text.push_back(Traits::to_char_type(c));
-        c = buffer.snextc();
-    }
-    if (isEnd(c)) {
-        in.setstate(std::ios_base::eofbit);
-    }
+    text = memory;
     return true;
 }

@@ -1,4 +1,4 @@
-// The text stream form of records, field by field, on the stream's buffer.
+// The text stream form of records, field by field, read from the stream's buffer; RecordWriter.h writes it.
 //
 // The fields are made and read here rather than by the stream's operators: those obey the locale, base and width that
 // the caller's stream happens to have, and they cost several times as much.
@@ -6,25 +6,13 @@
 
 #include <iosfwd>
 #include <string>
-
-/// Gathers the fields of one record, so that the stream sees a single write.
-class RecordWriter {
-public:
-    void addInt(int value);
-    /// Null counts as the empty text.
-    void addText(const char* text);
-    /// The text alone, without its length, and a line feed.
-    void addLine(const char* text);
-    void writeTo(std::ostream& out) const;
-
-private:
-    std::string m_form;
-};
+#include <string_view>
 
 /// Reads a decimal number as formatted extraction does: 0 where no number stands, the nearest limit where it is too
 /// large, both with the fail state; unchanged where the stream was not good or ended before a field.
 bool readRecordInt(std::istream& in, int& value);
 
-/// Reads a text field: its length and at most that many characters up to white space. False, with the fail state and
-/// an unchanged @p text, where the field is not there.
-bool readRecordText(std::istream& in, std::string& text);
+/// Reads a text field: its length and at most that many characters up to white space. @p text lies in @p memory or in
+/// the stream's buffer, and is good until either is used again. False, with the fail state and an unchanged @p text,
+/// where the field is not there.
+bool readRecordText(std::istream& in, std::string& memory, std::string_view& text);

@@ -99,9 +99,8 @@ void Attachment::set(const char* name, std::int32_t initial, std::int32_t maximu
     m_segment->sign = CountSegment::ourSign;
 }
 
-void Attachment::removeIfIdle(key_t key) const {
+bool Attachment::removeIfIdle(key_t key) const {
     shmid_ds state{};
-    if (SystemV::inspectSegment(m_identifier, state) == 0 && state.shm_perm.__key == key && state.shm_nattch == 0) {
-        SystemV::removeSegment(m_identifier);
-    }
+    return SystemV::inspectSegment(m_identifier, state) == 0 && state.shm_perm.__key == key && state.shm_nattch == 0 &&
+           SystemV::removeSegment(m_identifier) == 0;
 }

@@ -54,9 +54,9 @@ public:
     /// Fits the segment out for @p name.
     void set(const char* name, std::int32_t initial, std::int32_t maximum) const;
 
-    /// Removes the segment that this was an attachment of, if it is still that of @p key and nobody is attached. For
-    /// use under the opening lock.
-    void removeIfIdle(key_t key) const;
+    /// Removes the segment that this was an attachment of, if it is still that of @p key and nobody is attached: true
+    /// if removed. For use under the opening lock.
+    bool removeIfIdle(key_t key) const;
 
 private:
     Outcome attach(int identifier);

@@ -3,29 +3,17 @@
 
 #include <unistd.h>
 
-#include <utility>
+#include "platform/Owner.h"
 
 namespace platform {
 
-class Descriptor {
-public:
-    Descriptor() = default;
-    explicit Descriptor(int number) : m_number(number) {}
-    Descriptor(Descriptor&& other) noexcept : m_number(other.release()) {}
-    Descriptor& operator=(Descriptor&& other) noexcept {
-        std::swap(m_number, other.m_number);
-        return *this;
-    }
-    ~Descriptor() { close(); }
-
-    bool isOpen() const { return m_number >= 0; }
-    int number() const { return m_number; }
-    int release() { return std::exchange(m_number, -1); }
-    /// Closes it now; false when the host lost data that was written.
-    bool close() { return m_number < 0 || ::close(release()) == 0; }
-
-private:
-    int m_number = -1;
+struct DescriptorRules {
+    using Value = int;
+    static int none() { return -1; }
+    static bool isOpen(int number) { return number >= 0; }
+    static bool close(int number) { return ::close(number) == 0; }
 };
+
+using Descriptor = Owner<DescriptorRules>;
 
 }  // namespace platform

@@ -20,7 +20,7 @@ bool transfer(const Descriptor& source, Replacement& copy) {
     constexpr std::size_t chunk = std::size_t{128} * 1024;
     const std::unique_ptr<char[]> buffer(new char[chunk]);
     for (;;) {
-        const ssize_t got = uninterrupted([&] { return ::read(source.number(), buffer.get(), chunk); });
+        const ssize_t got = uninterrupted([&] { return ::read(source.get(), buffer.get(), chunk); });
         if (got <= 0) {
             return got == 0;
         }
@@ -36,7 +36,7 @@ bool copyFile(const char* source, const char* destination) {
     const Descriptor from(uninterrupted(
         [&] { return ::open(nativePath(source).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY); }));
     struct stat original {};
-    if (!from.isOpen() || ::fstat(from.number(), &original) != 0 || !S_ISREG(original.st_mode)) {
+    if (!from.isOpen() || ::fstat(from.get(), &original) != 0 || !S_ISREG(original.st_mode)) {
         return false;
     }
     const std::string target = linkResolved(nativePath(destination));

@@ -36,7 +36,7 @@ sockaddr_un addressOf(const std::string& path) {
 
 bool bindTo(const Descriptor& socket, const std::string& path) {
     const sockaddr_un address = addressOf(path);
-    return ::bind(socket.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
+    return ::bind(socket.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
 }
 
 /// Makes the socket listen under the path. It comes to its name whole: bound under another one, closed to others and
@@ -48,7 +48,7 @@ bool publish(const Descriptor& socket, const std::string& path) {
     if (!bindTo(socket, unfinished)) {
         return false;
     }
-    if (::chmod(unfinished.c_str(), 0600) == 0 && ::listen(socket.number(), oneClient) == 0 &&
+    if (::chmod(unfinished.c_str(), 0600) == 0 && ::listen(socket.get(), oneClient) == 0 &&
         ::rename(unfinished.c_str(), path.c_str()) == 0) {
         return true;
     }
@@ -81,12 +81,12 @@ public:
     Pipe create(const char* name) override {
         const std::string path = pipePath(name);
         Descriptor socket = path.empty() ? Descriptor() : newSocket();
-        if (!socket.isOpen() || !isFreeForSocket(path) || !holdPipeLock(socket.number(), path)) {
+        if (!socket.isOpen() || !isFreeForSocket(path) || !holdPipeLock(socket.get(), path)) {
             return noPipe;
         }
         if (!publish(socket, path)) {
             const int error = errno;
-            dropPipeLock(socket.number());
+            dropPipeLock(socket.get());
             errno = error;
             return noPipe;
         }
@@ -98,7 +98,7 @@ public:
     bool waitForClient(Pipe pipe) override {
         const int number = descriptor(pipe);
         const Descriptor connection(retried([&] { return ::accept4(number, nullptr, nullptr, SOCK_CLOEXEC); }));
-        return connection.isOpen() && retried([&] { return ::dup3(connection.number(), number, O_CLOEXEC); }) >= 0;
+        return connection.isOpen() && retried([&] { return ::dup3(connection.get(), number, O_CLOEXEC); }) >= 0;
     }
 
     // A server end has room for one client; connecting to one that is taken must fail, not wait.
@@ -109,18 +109,19 @@ public:
             return noPipe;
         }
         const sockaddr_un address = addressOf(path);
-        const int flags = ::fcntl(socket.number(), F_GETFL);
-        if (::fcntl(socket.number(), F_SETFL, flags | O_NONBLOCK) != 0 ||
-            ::connect(socket.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address) != 0 ||
-            ::fcntl(socket.number(), F_SETFL, flags) != 0) {
+        const int flags = ::fcntl(socket.get(), F_GETFL);
+        if (::fcntl(socket.get(), F_SETFL, flags | O_NONBLOCK) != 0 ||
+            ::connect(socket.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) != 0 ||
+            ::fcntl(socket.get(), F_SETFL, flags) != 0) {
             return noPipe;
         }
         return static_cast<Pipe>(socket.release());
     }
 
+    // Whoever reads wants all the bytes: waiting for all of them wakes it once for a block, not for each part of it.
     std::int64_t read(Pipe pipe, char* data, int length) override {
         const ssize_t moved =
-            retried([&] { return ::recv(descriptor(pipe), data, static_cast<std::size_t>(length), 0); });
+            retried([&] { return ::recv(descriptor(pipe), data, static_cast<std::size_t>(length), MSG_WAITALL); });
         return closedIsBroken(moved);
     }
 
@@ -150,7 +151,7 @@ private:
 
 }  // namespace
 
-PipeHost& realPipeHost() {
+PipeHost& pipeHost() {
     static PosixPipeHost& host = *new PosixPipeHost;
     return host;
 }

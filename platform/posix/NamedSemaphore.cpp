@@ -135,29 +135,35 @@ PlatformSemaphore* settle(key_t key, key_t firstKey, const char* name, const Bir
     return makeHandle(std::move(attachment), key, firstKey);
 }
 
+/// A handle, or null, and whether the semaphore lived before.
+struct Joined {
+    PlatformSemaphore* handle = nullptr;
+    bool wasThere = false;
+};
+
 /// Opens the semaphore, and gives birth to it where it does not live and @p birth is not null.
-PlatformSemaphore* join(const char* name, const Birth* birth) {
+Joined join(const char* name, const Birth* birth) {
     const key_t firstKey = keyOfName(name);
     const auto whereAbsent = birth != nullptr ? OpeningLock::WhereAbsent::Make : OpeningLock::WhereAbsent::Give;
     const OpeningLock lock(firstKey, openingBound, whereAbsent);
     failureCode = notFound;
     if (!lock.isHeld()) {
-        return nullptr;
+        return {};
     }
     Findings findings = search(firstKey, name);
     if (findings.failed) {
-        return nullptr;
+        return {};
     }
     if (findings.living.segment() != nullptr) {
-        return makeHandle(std::move(findings.living), findings.key, firstKey);
+        return {makeHandle(std::move(findings.living), findings.key, firstKey), true};
     }
     if (birth == nullptr) {
-        return refuse(notFound, "there is none of this name");
+        return {refuse(notFound, "there is none of this name")};
     }
     if (!findings.hasRoom) {
-        return refuse(notFound, "other segments have its keys, see ipcs -m");
+        return {refuse(notFound, "other segments have its keys, see ipcs -m")};
     }
-    return settle(findings.key, firstKey, name, *birth);
+    return {settle(findings.key, firstKey, name, *birth)};
 }
 
 /// Removes what nobody uses any more. Where another user owns it, or somebody stands still inside the lock, it stays
@@ -167,10 +173,12 @@ void tidyUp(const PlatformSemaphore& closed) {
     if (!lock.isHeld()) {
         return;
     }
-    closed.attachment.removeIfIdle(closed.key);
+    const bool isRemoved = closed.attachment.removeIfIdle(closed.key);
     bool isNeeded = false;
     for (key_t i = 0; i < keysOfName && !isNeeded; ++i) {
-        isNeeded = SystemV::getSegment(closed.firstKey + i, 0, 0) != -1;
+        const key_t key = closed.firstKey + i;
+        const bool isKnownFree = isRemoved && key == closed.key;  // who holds the lock alone makes segments
+        isNeeded = !isKnownFree && SystemV::getSegment(key, 0, 0) != -1;
     }
     if (!isNeeded) {
         lock.remove();
@@ -180,10 +188,10 @@ void tidyUp(const PlatformSemaphore& closed) {
 }  // namespace
 
 PlatformSemaphore* open(const char* name) {
-    return isLegal(name) ? join(name, nullptr) : refuse(invalidParameter, "its name is empty or too long");
+    return isLegal(name) ? join(name, nullptr).handle : refuse(invalidParameter, "its name is empty or too long");
 }
 
-PlatformSemaphore* create(const char* name, std::int32_t initial, std::int32_t maximum) {
+PlatformSemaphore* create(const char* name, std::int32_t initial, std::int32_t maximum, bool* wasThere) {
     if (!isLegal(name)) {
         return refuse(invalidParameter, "its name is empty or too long");
     }
@@ -191,7 +199,11 @@ PlatformSemaphore* create(const char* name, std::int32_t initial, std::int32_t m
         return refuse(invalidParameter, "its counts are out of range");
     }
     const Birth birth{initial, maximum};
-    return join(name, &birth);
+    const Joined joined = join(name, &birth);
+    if (wasThere != nullptr) {
+        *wasThere = joined.wasThere;
+    }
+    return joined.handle;
 }
 
 PlatformSemaphore* duplicate(PlatformSemaphore* handle) {

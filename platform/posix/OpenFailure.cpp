@@ -11,6 +11,15 @@
 namespace OpenFailure {
 namespace {
 
+/// Put into words when somebody asks only: most opens meet refusals that are no failure.
+struct Failure {
+    const char* words;
+    const char* call;  ///< the call that failed, and its errno; null where it was none
+    int error;
+    int holder;  ///< who stands still in the opening lock; 0 for nobody
+};
+
+thread_local Failure last{};
 thread_local std::array<char, 256> text{};
 
 struct Advice {
@@ -40,22 +49,28 @@ const char* adviceFor(const char* call, int error) {
 }  // namespace
 
 void noteHostCall() {
-    const int error = errno;
-    const char* const call = SystemV::lastCall;
-    std::snprintf(text.data(), text.size(), "%s: %s%s", call, std::generic_category().message(error).c_str(),
-                  adviceFor(call, error));
+    last = {"", SystemV::lastCall, errno, 0};
 }
 
 void noteBusy(int holder) {
-    std::snprintf(text.data(), text.size(), "process %d stands still while it opens or closes it", holder);
+    last = {"", nullptr, 0, holder};
 }
 
 void note(const char* words) {
-    std::snprintf(text.data(), text.size(), "%s", words);
+    last = {words, nullptr, 0, 0};
 }
 
 const char* words() {
-    return text.data();
+    if (last.call != nullptr) {
+        std::snprintf(text.data(), text.size(), "%s: %s%s", last.call,
+                      std::generic_category().message(last.error).c_str(), adviceFor(last.call, last.error));
+        return text.data();
+    }
+    if (last.holder != 0) {
+        std::snprintf(text.data(), text.size(), "process %d stands still while it opens or closes it", last.holder);
+        return text.data();
+    }
+    return last.words != nullptr ? last.words : "";
 }
 
 }  // namespace OpenFailure

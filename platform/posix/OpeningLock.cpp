@@ -51,7 +51,6 @@ OpeningLock::Step OpeningLock::tryOnce(key_t key, milliseconds left, WhereAbsent
     const int flags = whereAbsent == WhereAbsent::Make ? IPC_CREAT | SystemV::everyone : 0;
     const int set = SystemV::getSet(key, setSize, flags);
     if (set == -1) {
-        m_absent = errno == ENOENT;
         OpenFailure::noteHostCall();
         return Step::GivenUp;
     }

@@ -24,9 +24,6 @@ public:
 
     bool isHeld() const { return m_set != none; }
 
-    /// Where it is not held: true if no set was there, and none was to be made.
-    bool wasAbsent() const { return m_absent; }
-
     /// Removes the set, which lets go of the lock too; where that is another user's right, only lets go.
     void remove();
 
@@ -39,5 +36,4 @@ private:
     static constexpr int none = -1;  // 0 is an identifier like any other
 
     int m_set = none;
-    bool m_absent = false;
 };

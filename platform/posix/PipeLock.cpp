@@ -63,7 +63,7 @@ flock wholeFile(short type) {
 bool isSameFile(const Descriptor& file, const std::string& path) {
     struct stat opened {};
     struct stat named {};
-    return ::fstat(file.number(), &opened) == 0 && ::lstat(path.c_str(), &named) == 0 &&
+    return ::fstat(file.get(), &opened) == 0 && ::lstat(path.c_str(), &named) == 0 &&
            opened.st_ino == named.st_ino && opened.st_dev == named.st_dev;
 }
 
@@ -75,7 +75,7 @@ Descriptor lockFile(const std::string& path) {
         if (!file.isOpen()) {
             return file;
         }
-        if (::fcntl(file.number(), F_OFD_SETLK, &range) != 0) {
+        if (::fcntl(file.get(), F_OFD_SETLK, &range) != 0) {
             errno = EADDRINUSE;
             return {};
         }
@@ -112,7 +112,7 @@ void dropPipeLock(int serverEnd) {
 bool isPipeLocked(const std::string& path) {
     const Descriptor file(::open(lockPath(path).c_str(), O_RDWR | O_CLOEXEC | O_NOFOLLOW));
     flock range = wholeFile(F_WRLCK);
-    return file.isOpen() && ::fcntl(file.number(), F_OFD_GETLK, &range) == 0 && range.l_type != F_UNLCK;
+    return file.isOpen() && ::fcntl(file.get(), F_OFD_GETLK, &range) == 0 && range.l_type != F_UNLCK;
 }
 
 }  // namespace platform

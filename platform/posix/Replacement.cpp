@@ -37,12 +37,12 @@ Replacement::~Replacement() {
 }
 
 bool Replacement::setRights(mode_t rights) {
-    return ::fchmod(m_file.number(), rights) == 0;
+    return ::fchmod(m_file.get(), rights) == 0;
 }
 
 bool Replacement::write(const char* data, std::size_t size) {
     while (size > 0) {
-        const ssize_t written = uninterrupted([&] { return ::write(m_file.number(), data, size); });
+        const ssize_t written = uninterrupted([&] { return ::write(m_file.get(), data, size); });
         if (written <= 0) {
             return false;
         }
@@ -53,7 +53,7 @@ bool Replacement::write(const char* data, std::size_t size) {
 }
 
 bool Replacement::store() {
-    return ::fsync(m_file.number()) == 0 || errno == EINVAL;  // EINVAL: nothing to be stored
+    return ::fsync(m_file.get()) == 0 || errno == EINVAL;  // EINVAL: nothing to be stored
 }
 
 bool Replacement::putInPlace() {

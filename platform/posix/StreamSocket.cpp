@@ -116,8 +116,9 @@ public:
                (errno == EINTR && finishConnect(number));
     }
 
+    // Whoever reads wants all the bytes: waiting for all of them wakes it once for a block, not for each part of it.
     std::int64_t receive(Socket socket, char* data, int length) override {
-        return retried([&] { return ::recv(descriptor(socket), data, static_cast<std::size_t>(length), 0); });
+        return retried([&] { return ::recv(descriptor(socket), data, static_cast<std::size_t>(length), MSG_WAITALL); });
     }
 
     std::int64_t send(Socket socket, const char* data, int length) override {

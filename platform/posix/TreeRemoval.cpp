@@ -36,8 +36,8 @@ bool isSame(const Level& level, const struct stat& status) {
 
 std::vector<std::string> namesIn(const Descriptor& directory) {
     std::vector<std::string> names;
-    Descriptor own(::openat(directory.number(), ".", directoryOnly));
-    const std::unique_ptr<DIR, int (*)(DIR*)> listing(own.isOpen() ? ::fdopendir(own.number()) : nullptr, &::closedir);
+    Descriptor own(::openat(directory.get(), ".", directoryOnly));
+    const std::unique_ptr<DIR, int (*)(DIR*)> listing(own.isOpen() ? ::fdopendir(own.get()) : nullptr, &::closedir);
     if (listing == nullptr) {
         return names;
     }
@@ -73,12 +73,12 @@ private:
     /// Makes the directory the one to empty: removes its files and notes its subdirectories.
     bool enter(Descriptor directory, const std::string& name) {
         struct stat status {};
-        if (::fstat(directory.number(), &status) != 0) {
+        if (::fstat(directory.get(), &status) != 0) {
             return false;
         }
         Level level{name, status.st_dev, status.st_ino, {}};
         for (std::string& entry : namesIn(directory)) {
-            if (::unlinkat(directory.number(), entry.c_str(), 0) != 0 && errno == EISDIR) {
+            if (::unlinkat(directory.get(), entry.c_str(), 0) != 0 && errno == EISDIR) {
                 level.subdirectories.push_back(std::move(entry));
             }
         }
@@ -89,23 +89,23 @@ private:
 
     /// Enters a subdirectory, or removes it at once where it cannot be searched: then it is empty or has to stay.
     void descend(const std::string& name) {
-        Descriptor directory(::openat(m_here.number(), name.c_str(), directoryOnly | O_NOFOLLOW));
+        Descriptor directory(::openat(m_here.get(), name.c_str(), directoryOnly | O_NOFOLLOW));
         struct stat wayBack {};
-        const bool searchable = directory.isOpen() && ::fstatat(directory.number(), "..", &wayBack, 0) == 0;
+        const bool searchable = directory.isOpen() && ::fstatat(directory.get(), "..", &wayBack, 0) == 0;
         if (!searchable || !enter(std::move(directory), name)) {
-            ::unlinkat(m_here.number(), name.c_str(), AT_REMOVEDIR);
+            ::unlinkat(m_here.get(), name.c_str(), AT_REMOVEDIR);
         }
     }
 
     /// Goes back to the parent and removes the directory left; false when the way back is lost.
     bool ascend() {
-        Descriptor parent(::openat(m_here.number(), "..", directoryOnly));
+        Descriptor parent(::openat(m_here.get(), "..", directoryOnly));
         struct stat status {};
-        if (!parent.isOpen() || ::fstat(parent.number(), &status) != 0 ||
+        if (!parent.isOpen() || ::fstat(parent.get(), &status) != 0 ||
             !isSame(m_levels[m_levels.size() - 2], status)) {
             return false;
         }
-        ::unlinkat(parent.number(), m_levels.back().name.c_str(), AT_REMOVEDIR);
+        ::unlinkat(parent.get(), m_levels.back().name.c_str(), AT_REMOVEDIR);
         m_levels.pop_back();
         m_here = std::move(parent);
         return true;

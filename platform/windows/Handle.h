@@ -3,30 +3,17 @@
 
 #include <windows.h>
 
-#include <utility>
+#include "platform/Owner.h"
 
 namespace platform {
 
-class Handle {
-public:
-    Handle() = default;
-    explicit Handle(HANDLE handle) : m_handle(handle) {}
-    Handle(Handle&& other) noexcept : m_handle(std::exchange(other.m_handle, INVALID_HANDLE_VALUE)) {}
-    Handle& operator=(Handle&& other) noexcept {
-        std::swap(m_handle, other.m_handle);
-        return *this;
-    }
-    ~Handle() {
-        if (isOpen()) {
-            CloseHandle(m_handle);
-        }
-    }
-
-    bool isOpen() const { return m_handle != INVALID_HANDLE_VALUE && m_handle != nullptr; }
-    HANDLE get() const { return m_handle; }
-
-private:
-    HANDLE m_handle = INVALID_HANDLE_VALUE;
+struct HandleRules {
+    using Value = HANDLE;
+    static HANDLE none() { return INVALID_HANDLE_VALUE; }
+    static bool isOpen(HANDLE handle) { return handle != INVALID_HANDLE_VALUE && handle != nullptr; }
+    static bool close(HANDLE handle) { return CloseHandle(handle) != FALSE; }
 };
+
+using Handle = Owner<HandleRules>;
 
 }  // namespace platform

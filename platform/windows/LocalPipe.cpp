@@ -79,7 +79,7 @@ public:
 
 }  // namespace
 
-PipeHost& realPipeHost() {
+PipeHost& pipeHost() {
     static WindowsPipeHost& host = *new WindowsPipeHost;
     return host;
 }

@@ -34,8 +34,12 @@ PlatformSemaphore* open(const char* name) {
     return toHandle(semaphoreCalls.openSemaphore(fullAccess, FALSE, name));
 }
 
-PlatformSemaphore* create(const char* name, std::int32_t initial, std::int32_t maximum) {
-    return toHandle(semaphoreCalls.createSemaphore(nullptr, initial, maximum, name));
+PlatformSemaphore* create(const char* name, std::int32_t initial, std::int32_t maximum, bool* wasThere) {
+    PlatformSemaphore* const living = open(name);
+    if (wasThere != nullptr) {
+        *wasThere = living != nullptr;
+    }
+    return living != nullptr ? living : toHandle(semaphoreCalls.createSemaphore(nullptr, initial, maximum, name));
 }
 
 PlatformSemaphore* duplicate(PlatformSemaphore* handle) {

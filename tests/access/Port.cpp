@@ -1,41 +1,31 @@
 #include "Port.h"
 
 #include <chrono>
-#include <functional>
 #include <iostream>
-#include <map>
 #include <stdexcept>
 
 #include "host/Role.h"
 
 namespace {
 
-using Operation = std::function<int(Access&)>;
-
-const std::map<std::string, Operation>& operations() {
-    static const std::map<std::string, Operation> table = {
-        {"lock", [](Access& access) { return static_cast<int>(access.lock()); }},
-        {"unlock", [](Access& access) { return static_cast<int>(access.unlock()); }},
-        {"clean", [](Access& access) { return static_cast<int>(access.cleanLock()); }},
-        {"inc", [](Access& access) { return access.incCount(); }},
-        {"dec", [](Access& access) { return access.decCount(); }},
-        {"clients", [](Access& access) { return access.getNormalizedCount(); }},
-    };
-    return table;
-}
-
-int usePort(const RoleArguments& arguments) {
-    Access access(std::stoi(arguments.at(0)), static_cast<Access::ACCESS_TYPE>(std::stoi(arguments.at(1))));
-    std::cout << "open" << std::endl;
-    for (std::string line; std::getline(std::cin, line) && line != "end";) {
-        std::cout << operations().at(line)(access) << std::endl;
-    }
-    return 0;
+int answer(Access& access, const std::string& line) {
+    return line == "lock"  ? static_cast<int>(access.lock())
+           : line == "dec" ? access.decCount()
+                           : access.getNormalizedCount();
 }
 
 const Role portUser{"port user", &usePort};
 
 }  // namespace
+
+int usePort(const RoleArguments& arguments) {
+    Access access(std::stoi(arguments.at(0)), static_cast<Access::ACCESS_TYPE>(std::stoi(arguments.at(1))));
+    std::cout << "open" << std::endl;
+    for (std::string line; std::getline(std::cin, line) && line != "end";) {
+        std::cout << answer(access, line) << std::endl;
+    }
+    return 0;
+}
 
 int freshPort() {
     // A range of a thousand ids for each microsecond at which a test may start.

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 #include "Access.h"
 #include "host/ChildProcess.h"
@@ -9,8 +10,8 @@
 /// An id of its own at each call.
 int freshPort();
 
-/// A process with one Access, which does what it is told by the lines "lock", "unlock", "clean", "inc", "dec" and
-/// "clients", and answers each with its result. It ends in order at "end".
+/// A process with one Access, which does what it is told by the lines "lock", "dec" and "clients", and answers each
+/// with its result. It ends in order at "end".
 class PortUser {
 public:
     explicit PortUser(int port, Access::ACCESS_TYPE type = Access::SHARE);
@@ -18,11 +19,16 @@ public:
     int ask(const char* operation) { return std::stoi(m_process.ask(operation)); }
     void kill() { m_process.kill(); }
     int end();
-    ChildProcess& process() { return m_process; }
 
 private:
     ChildProcess m_process;
 };
+
+/// What the process does: a role with a port and a type.
+int usePort(const std::vector<std::string>& arguments);
+
+/// True if the machine holds nothing of the semaphore of a SHARE.
+bool isNothingLeft(int port);
 
 /// True if a new Access finds the port free and can take it, as it must where nobody else is.
 bool isFree(int port);

@@ -17,6 +17,21 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::StartsWith;
 
+namespace {
+
+template <class Body>
+void inThreads(Body body) {
+    std::vector<std::thread> threads;
+    for (int i = 0; i < 4; ++i) {
+        threads.emplace_back(body);
+    }
+    for (std::thread& thread : threads) {
+        thread.join();
+    }
+}
+
+}  // namespace
+
 TEST(AccessId, HasAFamilyForEachPortName) {
     struct {
         const char* name;
@@ -230,29 +245,47 @@ TEST(AccessProcesses, KilledClientsKeepTheirSlotsUntilTheLastOneGoes) {
     EXPECT_EQ(Access(port, Access::COUNT).getNormalizedCount(), 0);
 }
 
+// The role "stepper" opens, locks, gives back and closes a port, and is killed at one of its calls of the host.
+TEST(AccessSteps, KilledAtEachHostCallLeavesTheCountToThoseWhoRemainOrAFreshPort) {
+    for (const bool isKept : {false, true}) {
+        const int port = freshPort();
+        bool gotThrough = false;
+        for (int step = 1; !gotThrough && step < 100; ++step) {
+            SCOPED_TRACE("step " + std::to_string(step) + (isKept ? " beside a holder" : ""));
+            std::vector<Access> keepers;
+            if (isKept) {
+                keepers.emplace_back(port, Access::SHARE);
+                ASSERT_TRUE(keepers.front().lock());
+            }
+            ChildProcess child("stepper", {"kill", std::to_string(step), std::to_string(port)});
+            gotThrough = child.wait() == 0;
+            ASSERT_EQ(isFree(port), !isKept);
+            ASSERT_TRUE(!isKept || keepers.front().unlock());
+            ASSERT_TRUE(isFree(port));
+            keepers.clear();
+            ASSERT_TRUE(isNothingLeft(port));
+        }
+        EXPECT_TRUE(gotThrough);
+    }
+}
+
 // Not among the cases for ThreadSanitizer: it does not see that the kernel's semaphore keeps the openers apart.
 TEST(Access, ManyAtOnceOpenAndCloseOneName) {
     const int port = freshPort();
     std::atomic<int> holders{0};
     std::atomic<int> faults{0};
-    std::vector<std::thread> threads;
-    for (int i = 0; i < 4; ++i) {
-        threads.emplace_back([&] {
-            for (int round = 0; round < 300; ++round) {
-                Access access(port, Access::SHARE);
-                if (access.lock()) {
-                    faults += ++holders != 1;
-                    --holders;
-                    faults += !access.unlock();
-                }
+    inThreads([&] {
+        for (int round = 0; round < 300; ++round) {
+            Access access(port, Access::SHARE);
+            if (access.lock()) {
+                faults += ++holders != 1;
+                --holders;
+                faults += !access.unlock();
             }
-        });
-    }
-    for (std::thread& thread : threads) {
-        thread.join();
-    }
+        }
+    });
     EXPECT_EQ(faults, 0);
-    EXPECT_EQ(NamedSemaphore::open(("CableSharing" + std::to_string(port)).c_str()), nullptr);
+    EXPECT_TRUE(isNothingLeft(port));
 }
 
 TEST(AccessThreads, NeverReleasePastTheMaximum) {
@@ -260,21 +293,15 @@ TEST(AccessThreads, NeverReleasePastTheMaximum) {
     Access observer(port, Access::COUNT);
     std::atomic<int> given{0};
     std::atomic<int> taken{0};
-    std::vector<std::thread> threads;
-    for (int i = 0; i < 3; ++i) {
-        threads.emplace_back([&] {
-            Access access(port, Access::COUNT);
-            PlatformSemaphore* const units = NamedSemaphore::open(("CableShareCount" + std::to_string(port)).c_str());
-            for (int round = 0; round < 10000; ++round) {
-                given += NamedSemaphore::release(units, 1, nullptr);
-                taken += access.decCount();
-            }
-            NamedSemaphore::close(units);
-        });
-    }
-    for (std::thread& thread : threads) {
-        thread.join();
-    }
+    inThreads([&] {
+        Access access(port, Access::COUNT);
+        PlatformSemaphore* const units = NamedSemaphore::open(("CableShareCount" + std::to_string(port)).c_str());
+        for (int round = 0; round < 10000; ++round) {
+            given += NamedSemaphore::release(units, 1, nullptr);
+            taken += access.decCount();
+        }
+        NamedSemaphore::close(units);
+    });
     EXPECT_EQ(observer.getNormalizedCount(), taken - given);
     EXPECT_GE(taken - given, 0);
     EXPECT_LE(taken - given, 5);

@@ -18,7 +18,6 @@
 #include "Port.h"
 #include "host/Role.h"
 #include "host/SharedFile.h"
-#include "platform/NamedSemaphore.h"
 
 namespace {
 
@@ -206,9 +205,7 @@ private:
     void checkFresh() {
         expect(isFree(m_port), "the port is blocked");
         expect(Access(m_port, Access::COUNT).getNormalizedCount() == 0, "slots outlive their clients");
-        PlatformSemaphore* const left = NamedSemaphore::open(("CableSharing" + std::to_string(m_port)).c_str());
-        expect(left == nullptr, "the semaphore outlives its handles");
-        NamedSemaphore::close(left);
+        expect(isNothingLeft(m_port), "the semaphore outlives its handles");
     }
 
     void addUp() {

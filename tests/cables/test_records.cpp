@@ -18,6 +18,42 @@ struct BareRecord : Streamable {
     void writeStream(std::ostream& out) override { Streamable::writeStream(out); }
 };
 
+/// A buffer that gives one character at a time and holds none ready.
+class Trickle : public std::streambuf {
+public:
+    explicit Trickle(std::string text) : m_text(std::move(text)) {}
+
+protected:
+    int_type underflow() override { return m_next < m_text.size() ? traits_type::to_int_type(m_text[m_next]) : -1; }
+    int_type uflow() override {
+        const int_type c = underflow();
+        m_next += c == -1 ? 0 : 1;
+        return c;
+    }
+
+private:
+    std::string m_text;
+    std::size_t m_next = 0;
+};
+
+/// Hands the text to @p check in a stream whose buffer holds all of it ready, and in one whose buffer holds nothing.
+template <class Check>
+void throughBothBuffers(const std::string& text, Check check) {
+    std::stringbuf whole(text);
+    Trickle trickle(text);
+    for (std::streambuf* const buffer :
+         {static_cast<std::streambuf*>(&whole), static_cast<std::streambuf*>(&trickle)}) {
+        SCOPED_TRACE(text + (buffer == &whole ? "whole" : "in trickles"));
+        std::istream in(buffer);
+        check(in);
+    }
+}
+
+std::string rest(std::istream& in) {
+    in.clear();
+    return {std::istreambuf_iterator<char>(in), {}};
+}
+
 std::string written(Streamable& record) {
     std::ostringstream out;
     record.writeStream(out);
@@ -40,24 +76,25 @@ struct Grouping : std::numpunct<char> {
 };
 
 TEST(Streamable, TheIdTravelsAsADecimalLine) {
-    for (const char* const text : {"7\n", " \n\t-12 ", "+5x", "", "   ", "x", "-", "2147483647 ", "2147483648 ",
-                                   "-2147483648 ", "-99999999999999999999999 "}) {
-        SCOPED_TRACE(text);
-        BareRecord record;
-        std::istringstream in(text);
-        record.readStream(in);
-        int standard = 0;
-        std::istringstream again(text);
-        again >> standard;
-        EXPECT_EQ(record.getId(), standard);
-        EXPECT_EQ(in.rdstate(), again.rdstate());
-        EXPECT_EQ(written(record), std::to_string(standard) + "\n");
+    for (const char* const text :
+         {"7\n", " \n\t-12 ", "+5x", "", "   ", "x", "-", "2147483647 ", "2147483648 ", "-2147483648 ",
+          "-99999999999999999999999 ", "000000000000007 ", "999999999", "9-"}) {
+        throughBothBuffers(text, [text](std::istream& in) {
+            BareRecord record;
+            record.readStream(in);
+            int standard = 0;
+            std::istringstream again(text);
+            again >> standard;
+            EXPECT_EQ(record.getId(), standard);
+            EXPECT_EQ(in.rdstate(), again.rdstate());
+            EXPECT_EQ(rest(in), rest(again));
+            EXPECT_EQ(written(record), std::to_string(standard) + "\n");
+        });
     }
 }
 
 TEST(NetString, StreamsOneWordAndNeverPassesItsLength) {
-    const std::tuple<const char*, const char*, const char*> cases[] = {// null: the former text stays
-                                                                       {"3\nabc\n9", "abc", "\n9"},
+    const std::tuple<const char*, const char*, const char*> cases[] = {{"3\nabc\n9", "abc", "\n9"},
                                                                        {"0\n\n9", "", "\n\n9"},
                                                                        {"3\nab cd\n", "ab", " cd\n"},
                                                                        {"2\nabc\n", "ab", "c\n"},
@@ -66,16 +103,16 @@ TEST(NetString, StreamsOneWordAndNeverPassesItsLength) {
                                                                        {"99999999999\nabc", nullptr, "\nabc"},
                                                                        {"3\n", nullptr, ""},
                                                                        {"x\nabc", nullptr, "x\nabc"}};
-    for (const auto& [text, read, rest] : cases) {
-        SCOPED_TRACE(text);
-        NetString field;
-        field.setString("former");
-        std::istringstream in(text);
-        field.readStream(in);
-        EXPECT_STREQ(field.getString(), read != nullptr ? read : "former");
-        EXPECT_EQ(in.fail(), read == nullptr);
-        in.clear();
-        EXPECT_EQ(std::string(std::istreambuf_iterator<char>(in), {}), rest);
+    for (const auto& row : cases) {
+        throughBothBuffers(std::get<0>(row), [&row](std::istream& in) {
+            const auto& [text, read, left] = row;
+            NetString field;
+            field.setString("former");
+            field.readStream(in);
+            EXPECT_STREQ(field.getString(), read != nullptr ? read : "former") << "null: the former text stays";
+            EXPECT_EQ(in.fail(), read == nullptr);
+            EXPECT_EQ(rest(in), left);
+        });
     }
 }
 
@@ -112,6 +149,20 @@ TEST(CableInfoStream, IsSixLinesWhateverTheStreamWasSetTo) {
     back.readStream(in);
     EXPECT_EQ(written(back), out.str());
     EXPECT_STREQ(back.getESN(), "kept");
+}
+
+TEST(CableInfoStream, TextsOfAnyLengthPassWhole) {
+    for (const int length : {200, 255, 256, 1000}) {
+        CableInfo cable = sampleCable();
+        const std::string name(static_cast<std::size_t>(length), 'n');
+        cable.setCableName(name.c_str());
+        EXPECT_EQ(written(cable), "4\nUSB2\n0\n6000000\n" + std::to_string(length) + "\n" + name + "\n");
+        throughBothBuffers(written(cable), [&](std::istream& in) {
+            CableInfo back;
+            back.readStream(in);
+            EXPECT_EQ(back.getCableName(), name);
+        });
+    }
 }
 
 TEST(CableInfoStream, ACutRecordKeepsEveryFieldThatIsNotThere) {

@@ -38,12 +38,15 @@ asked() {
 asked 0 "position 3: sim-logic, device code 02A20093" "setcable -port $address
 identify"
 if [ "$transport" = tcp ]; then
-    for bytes in '\x05\0' '\xff\xff\xff\x7fabc' '\x09\0\0\0no number' '\x02\0\0\x009\n'; do
+    for bytes in '\x05\0' '\xff\xff\xff\x7fabc' '\xff\xff\xff\xff' '\x09\0\0\0no number' '\x02\0\0\x009\n'; do
         exec 3<>"/dev/tcp/127.0.0.1/${address#tcp:}"
         printf "$bytes" >&3
         exec 3>&-
     done
 fi
+child=$(cat "/proc/$server/task/$server/children" 2>/dev/null || true)
+memory=$(awk '/^VmHWM/ { print $2 }' "/proc/${child%% *}/status" 2>/dev/null || echo 0)
+[ "$memory" -lt 500000 ] || fail "a length from the wire took $memory KiB"
 TESSAL_DEVICE=$address asked 0 "position 1: sim-prom-4m, device code 05045093" identify
 
 [ "$transport" = pipe ] || where=(--tcp "${address#tcp:}")

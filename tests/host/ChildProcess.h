@@ -6,6 +6,8 @@
 #include <string>
 #include <vector>
 
+struct HostChild;
+
 class ChildProcess {
 public:
     /// No process; only to be assigned to.
@@ -33,6 +35,6 @@ public:
     long id() const;
 
 private:
-    struct Body;
-    std::unique_ptr<Body> m_body;
+    std::unique_ptr<HostChild> m_child;
+    std::string m_received;
 };

@@ -20,7 +20,6 @@ public:
     /// Sets the connection up; false is a failed test.
     virtual bool connect() = 0;
     virtual void closeServerEnd() = 0;
-    virtual void closeClientEnd() = 0;
     virtual const char* receiveFailure() const = 0;
     /// True when both ends may be used at once by two threads.
     virtual bool isConcurrent() const { return true; }
@@ -69,7 +68,6 @@ public:
             m_server->setClientSocketFd(TessalSocket::noSocket);
         }
     }
-    void closeClientEnd() override { m_client->deinitialize(); }
     const char* receiveFailure() const override { return " recv() failed: "; }
 
 private:
@@ -98,7 +96,6 @@ public:
         return m_server->waitForClient() && connected.get();
     }
     void closeServerEnd() override { m_server->deinitialize(); }
-    void closeClientEnd() override { m_client->deinitialize(); }
     const char* receiveFailure() const override { return "ReadFile failed: "; }
 
 private:

@@ -1,9 +1,10 @@
-// What only a real process on a POSIX host can suffer: kills, signals, forks, leaks, foreign files.
+// What only a real process on a POSIX host can suffer: kills, stops, signals, forks, leaks, foreign files and users.
 
 #if !defined(_WIN32)
 
 #include <fcntl.h>
 #include <gmock/gmock.h>
+#include <grp.h>
 #include <gtest/gtest.h>
 #include <sys/resource.h>
 #include <sys/socket.h>
@@ -12,9 +13,11 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <chrono>
 #include <csignal>
 #include <filesystem>
 #include <fstream>
+#include <future>
 #include <iterator>
 #include <string>
 #include <thread>
@@ -26,35 +29,54 @@ namespace {
 
 using testing::ElementsAre;
 
-std::string pathIn(const char* directory, const char* name) {
-    return std::string(directory) + '/' + name + std::to_string(::getpid());
+std::string pathOf(const char* name) {
+    return "/tmp/tessal_" + std::string(name) + std::to_string(::getpid());
 }
 
-/// A child that runs the body and then waits to be killed; it tells by a byte that the body is done.
-template <class Body>
-pid_t startChild(Body body) {
-    int ready[2];
-    if (::pipe2(ready, O_CLOEXEC) != 0) {
-        return -1;
-    }
-    const pid_t child = ::fork();
-    if (child == 0) {
-        body();
-        while (::write(ready[1], "x", 1) == 1) {
+/// A child that runs the body and then waits to be killed, and is killed at the end.
+class Child {
+public:
+    template <class Body>
+    explicit Child(Body body) : m_process(::fork()) {
+        if (m_process == 0) {
+            body();
+            ::raise(SIGSTOP);  // which tells that the body is done
             ::pause();
+            ::_exit(0);
         }
-        ::_exit(0);
+        EXPECT_TRUE(isStopped());
     }
-    ::close(ready[1]);
-    char byte = 0;
-    EXPECT_EQ(::read(ready[0], &byte, 1), 1);
-    ::close(ready[0]);
-    return child;
-}
+    ~Child() { kill(); }
+    Child(const Child&) = delete;
+    Child& operator=(const Child&) = delete;
 
-void kill(pid_t child) {
-    ::kill(child, SIGKILL);
-    ::waitpid(child, nullptr, 0);
+    void goOn() const { ::kill(m_process, SIGCONT); }
+    /// Waits for its next stop.
+    bool isStopped() const {
+        int status = 0;
+        return ::waitpid(m_process, &status, WUNTRACED) == m_process && WIFSTOPPED(status);
+    }
+    void kill() {
+        if (m_process > 0) {
+            ::kill(m_process, SIGKILL);
+            ::waitpid(m_process, nullptr, 0);
+            m_process = -1;
+        }
+    }
+
+private:
+    pid_t m_process;
+};
+
+/// What a user without privileges finds; -1 where this one may not become another.
+int asAnotherUser(bool (*finds)(const std::string& name), const std::string& name) {
+    const pid_t child = ::geteuid() == 0 ? ::fork() : -1;
+    if (child == 0) {
+        const bool isOther = ::setgroups(0, nullptr) + ::setgid(65534) + ::setuid(65534) == 0;
+        ::_exit(isOther && finds(name) ? 1 : 0);
+    }
+    int status = -1;
+    return child > 0 && ::waitpid(child, &status, 0) == child ? WEXITSTATUS(status) : -1;
 }
 
 auto openDescriptors() {
@@ -76,16 +98,17 @@ TEST(TransportFaults, APeerKilledInTheMiddleOfAFieldAndAResetAreFailures) {
     int port = 0;
     const std::unique_ptr<TessalSocket> server = listeningServer(port);
     ASSERT_NE(server, nullptr);
-    const pid_t child = startChild([port] {
+    Child child([port] {
         static TessalSocket client(1, "127.0.0.1", port);
         client.initialize();
         client.writeSocket("\1\2", 2);
     });
     TessalSocket::Socket accepted = server->acceptClient(nullptr, nullptr);
-    kill(child);
+    child.kill();
     MessageRecorder messages;
     int value = 9;
     EXPECT_EQ(server->readInt(accepted, &value), 4);
+    EXPECT_EQ(value, 0);
     EXPECT_EQ(messages.status().size(), 1U);
     server->closeSocket(accepted);
 
@@ -101,9 +124,33 @@ TEST(TransportFaults, APeerKilledInTheMiddleOfAFieldAndAResetAreFailures) {
     EXPECT_THAT(messages.status(), ElementsAre(" recv() failed: 104\n"));
 }
 
-TEST(TransportFaults, AKilledServersPipeIsFreeAtOnce) {
-    const std::string name = pathIn("/tmp", "tessal_killed_");
-    const pid_t child = startChild([&name] {
+template <class LinkType>
+void waitForAStoppedPeer() {
+    LinkType link;
+    ASSERT_TRUE(link.connect());
+    Child child([&link] {
+        link.client.write("\4\3", 2);
+        ::raise(SIGSTOP);
+        link.client.write("\2\1", 2);
+    });
+    const MessageRecorder messages;
+    int value = 0;
+    std::future<void> reading = std::async(std::launch::async, [&] { link.server.readInt(&value); });
+    EXPECT_EQ(reading.wait_for(std::chrono::milliseconds(100)), std::future_status::timeout) << "half a number";
+    child.goOn();
+    reading.wait();
+    EXPECT_EQ(value, 0x01020304);
+    EXPECT_THAT(messages.status(), testing::IsEmpty());
+}
+
+TEST(TransportFaults, AStoppedPeerIsWaitedForAndGoesOn) {
+    waitForAStoppedPeer<SocketLink>();
+    waitForAStoppedPeer<PipeLink>();
+}
+
+TEST(TransportFaults, APipeNameIsFreeBehindAKilledServerAndAForkedChild) {
+    const std::string name = pathOf("killed_");
+    Child child([&name] {
         static TessalPipe server(0, name.c_str());
         server.initialize();
     });
@@ -111,29 +158,21 @@ TEST(TransportFaults, AKilledServersPipeIsFreeAtOnce) {
     TessalPipe second(0, name.c_str());
     EXPECT_TRUE(second.initialize());
     EXPECT_FALSE(second.waitForClient()) << "the child lives, so nothing was created";
-    kill(child);
+    child.kill();
     EXPECT_TRUE(isThere(name)) << "the socket file is left";
     TessalPipe third(0, name.c_str());
     EXPECT_TRUE(third.initialize());
     expectServed(third, name);
+    const Child forked([] {});
     third.deinitialize();
     EXPECT_FALSE(isThere(name) || isThere(name + ".lock"));
-}
-
-TEST(TransportFaults, AForkedChildDoesNotKeepTheNameTaken) {
-    const std::string name = pathIn("/tmp", "tessal_forked_");
-    auto server = std::make_unique<TessalPipe>(0, name.c_str());
-    ASSERT_TRUE(server->initialize());
-    const pid_t child = startChild([] {});
-    server->deinitialize();
-    TessalPipe next(0, name.c_str());
-    EXPECT_TRUE(next.initialize());
-    expectServed(next, name);  // not the child's copy of the old one
-    kill(child);
+    TessalPipe fourth(0, name.c_str());
+    EXPECT_TRUE(fourth.initialize());
+    expectServed(fourth, name);  // not the child's copy of the old one
 }
 
 TEST(TransportFaults, OnlyTheOwnerMayConnectAndForeignFilesStay) {
-    const std::string name = pathIn("/tmp", "tessal_mode_");
+    const std::string name = pathOf("mode_");
     const mode_t former = ::umask(0);
     TessalPipe server(0, name.c_str());
     ASSERT_TRUE(server.initialize());
@@ -151,6 +190,31 @@ TEST(TransportFaults, OnlyTheOwnerMayConnectAndForeignFilesStay) {
     EXPECT_EQ(content, "precious");
     ::unlink(name.c_str());
     EXPECT_FALSE(TessalPipe(0, ("/tmp/" + std::string(100, 'z')).c_str()).initialize()) << "too long for a socket";
+}
+
+TEST(TransportFaults, AnotherUsersPipeIsNeitherReachedNorTaken) {
+    const std::string name = pathOf("owned_");
+    const auto reaches = [](const std::string& pipe) { return TessalPipe(1, pipe.c_str()).initialize(); };
+    const auto takes = [](const std::string& pipe) { return TessalPipe(0, pipe.c_str()).initialize(); };
+    if (asAnotherUser([](const std::string&) { return true; }, name) != 1) {
+        GTEST_SKIP() << "needs the right to become another user";
+    }
+    TessalPipe server(0, name.c_str());
+    ASSERT_TRUE(server.initialize());
+    EXPECT_EQ(asAnotherUser(reaches, name), 0);
+    EXPECT_EQ(asAnotherUser(takes, name), 0);
+    expectServed(server, name);
+    server.deinitialize();
+    {
+        Child killed([&name] {
+            static TessalPipe left(0, name.c_str());
+            left.initialize();
+        });
+    }
+    EXPECT_EQ(asAnotherUser(takes, name), 0) << "the file that a killed server left is its user's";
+    EXPECT_TRUE(isThere(name));
+    EXPECT_TRUE(server.initialize());
+    server.deinitialize();
 }
 
 TEST(TransportFaults, SignalsBreakNoTransfer) {

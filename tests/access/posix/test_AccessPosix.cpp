@@ -11,6 +11,7 @@
 
 #include <cerrno>
 #include <chrono>
+#include <cstring>
 #include <fstream>
 #include <functional>
 #include <iostream>
@@ -19,27 +20,40 @@
 #include "../Port.h"
 #include "Access.h"
 #include "MessageRecorder.h"
-#include "StepHook.h"
 #include "host/Role.h"
 #include "platform/NamedSemaphore.h"
 #include "platform/posix/CountSegment.h"
 #include "platform/posix/NamedSemaphoreKeys.h"
 #include "platform/posix/SystemV.h"
 
-using StepHook::Action;
 using testing::ElementsAre;
 using testing::HasSubstr;
 
 namespace {
 
-key_t keyOf(int port) {
-    return NamedSemaphore::keyOfName(("CableSharing" + std::to_string(port)).c_str());
+/// What happens at one host call of this process: at the n-th from now on or, unless its name is null, the n-th of it.
+struct Step {
+    enum { Kill, Stop, Fail } action;
+    int left;
+    const char* call;
+    int error;
+} step;
+
+bool passStep(const char* call) {
+    if ((step.call != nullptr && std::strcmp(call, step.call) != 0) || --step.left != 0) {
+        return true;
+    }
+    errno = step.error;
+    return step.action != Step::Fail && ::raise(step.action == Step::Kill ? SIGKILL : SIGSTOP) == 0;
 }
 
-/// True if the machine holds nothing of the port's semaphore: no segment and no set.
-bool isNothingLeft(int port) {
-    const key_t key = keyOf(port);
-    return ::shmget(key, 0, 0) == -1 && ::shmget(key + 1, 0, 0) == -1 && ::semget(key, 0, 0) == -1;
+void setStep(const Step& next) {
+    step = next;
+    SystemV::filter = &passStep;
+}
+
+key_t keyOf(int port) {
+    return NamedSemaphore::keyOfName(("CableSharing" + std::to_string(port)).c_str());
 }
 
 void openLockAndClose(int port) {
@@ -60,13 +74,19 @@ int inChild(const std::function<int()>& body) {
 }
 
 /// Opens, locks, gives back and closes a port, and is ended or stopped at one of the host calls on that way.
-const Role stepper{"stepper", [](const RoleArguments& arguments) {
-                       StepHook::arm(arguments.at(0) == "kill" ? Action::Kill : Action::Stop,
-                                     std::stoi(arguments.at(1)));
-                       std::cout << "started" << std::endl;
-                       openLockAndClose(std::stoi(arguments.at(2)));
-                       return 0;
-                   }};
+const Role stepper{
+    "stepper", [](const RoleArguments& arguments) {
+        setStep({arguments.at(0) == "kill" ? Step::Kill : Step::Stop, std::stoi(arguments.at(1)), nullptr, 0});
+        std::cout << "started" << std::endl;
+        openLockAndClose(std::stoi(arguments.at(2)));
+        return 0;
+    }};
+
+const Role otherUser{"other user", [](const RoleArguments& arguments) {
+                         ::umask(0777);
+                         const bool isOther = ::setgroups(0, nullptr) + ::setgid(65534) + ::setuid(65534) == 0;
+                         return isOther ? usePort(arguments) : 1;
+                     }};
 
 /// Forks while it holds the port. The child sleeps, executes another program or returns through the destructors.
 const Role forker{"forker", [](const RoleArguments& arguments) {
@@ -100,34 +120,9 @@ std::chrono::milliseconds durationOf(const std::function<void()>& body) {
 
 }  // namespace
 
-TEST(AccessSteps, KilledAtEachHostCallLeavesAUsablePort) {
-    const int port = freshPort();
-    bool gotThrough = false;
-    for (int step = 1; !gotThrough && step < 100; ++step) {
-        ChildProcess child("stepper", {"kill", std::to_string(step), std::to_string(port)});
-        gotThrough = child.wait() == 0;
-        SCOPED_TRACE("step " + std::to_string(step));
-        ASSERT_TRUE(isFree(port));
-        ASSERT_TRUE(isNothingLeft(port));
-    }
-    EXPECT_TRUE(gotThrough);
-}
-
-TEST(AccessSteps, KilledAtEachHostCallLeavesTheCountToThoseWhoRemain) {
-    const int port = freshPort();
-    bool gotThrough = false;
-    for (int step = 1; !gotThrough && step < 100; ++step) {
-        Access keeper(port, Access::SHARE);
-        ASSERT_TRUE(keeper.lock());
-        ChildProcess child("stepper", {"kill", std::to_string(step), std::to_string(port)});
-        gotThrough = child.wait() == 0;
-        SCOPED_TRACE("step " + std::to_string(step));
-        ASSERT_FALSE(isFree(port));
-        ASSERT_TRUE(keeper.unlock());
-        ASSERT_TRUE(isFree(port));
-    }
-    EXPECT_TRUE(gotThrough);
-    EXPECT_TRUE(isNothingLeft(port));
+bool isNothingLeft(int port) {
+    const key_t key = keyOf(port);
+    return ::shmget(key, 0, 0) == -1 && ::shmget(key + 1, 0, 0) == -1 && ::semget(key, 0, 0) == -1;
 }
 
 TEST(AccessSteps, StoppedInsideTheOpeningLockDelaysOthersForABoundedTime) {
@@ -151,17 +146,17 @@ TEST(AccessSteps, EachHostCallMayFail) {
     const char* const calls[] = {"shmget", "shmat", "shmctl(IPC_STAT)", "madvise", "semget", "semtimedop"};
     for (const int error : {ENOSPC, EACCES, ENOMEM, ENOSYS}) {
         for (const char* const call : calls) {
-            for (int step = 1; step <= 4; ++step) {
-                SCOPED_TRACE(std::string(call) + " " + std::to_string(step) + " " + std::to_string(error));
+            for (int number = 1; number <= 4; ++number) {
+                SCOPED_TRACE(std::string(call) + " " + std::to_string(number) + " " + std::to_string(error));
                 const MessageRecorder messages;
                 {
-                    StepHook::arm(Action::Fail, step, call, error);
+                    setStep({Step::Fail, number, call, error});
                     Access access(port, Access::SHARE);
                     const bool opened = messages.info().empty();
                     EXPECT_EQ(access.lock(), opened);
                     EXPECT_TRUE(opened || messages.info().front().find(call) != std::string::npos)
                         << messages.info().front();
-                    StepHook::disarm();
+                    SystemV::filter = nullptr;
                 }
                 ASSERT_TRUE(isFree(port));
             }
@@ -214,30 +209,13 @@ TEST(AccessUsers, ShareAPortWhateverTheirUmask) {
         GTEST_SKIP() << "needs the right to become another user";
     }
     const int port = freshPort();
-    int ready[2];
-    int done[2];
-    ASSERT_EQ(::pipe(ready) + ::pipe(done), 0);
-    const pid_t other = ::fork();
-    if (other == 0) {
-        ::umask(0777);
-        if (::setgroups(0, nullptr) + ::setgid(65534) + ::setuid(65534) != 0) {
-            ::_exit(1);
-        }
-        Access access(port, Access::SHARE);
-        char byte = access.lock() ? 1 : 0;
-        ::_exit(::write(ready[1], &byte, 1) == 1 && ::read(done[0], &byte, 1) == 1 ? 0 : 1);  // like a kill
-    }
-    char byte = 0;
-    ASSERT_EQ(::read(ready[0], &byte, 1), 1);
+    ChildProcess other("other user", {std::to_string(port), std::to_string(Access::SHARE)});
+    ASSERT_EQ(other.read(), "open");
+    EXPECT_EQ(other.ask("lock"), "1");
     Access access(port, Access::SHARE);
-    EXPECT_EQ(byte, 1);
     EXPECT_FALSE(access.lock());
     EXPECT_TRUE(access.cleanLock());
-    ASSERT_EQ(::write(done[1], &byte, 1), 1);
-    ::waitpid(other, nullptr, 0);
-    for (const int descriptor : {ready[0], ready[1], done[0], done[1]}) {
-        ::close(descriptor);
-    }
+    EXPECT_EQ(other.ask("lock"), "1");
 }
 
 TEST(AccessUsers, LastCloserWhoMayNotRemoveLeavesItToTheNextOne) {

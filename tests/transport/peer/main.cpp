@@ -1,5 +1,6 @@
 // One end of a conversation over TCP, for the other end in another process: one of the other host's library, or of
-// another language. Each end sends the same fields in its turn, and reads what it gets both as fields and as bytes.
+// another language. The client sends its fields, reads the same from the server, and both compare; peer.py has the
+// bytes.
 //
 //     transport_peer server         prints its port, serves one client
 //     transport_peer client PORT
@@ -10,90 +11,55 @@
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
+#include <iterator>
 #include <memory>
 #include <string>
 
-#include "DataBuffer.h"
 #include "TessalSocket.h"
 
 namespace {
 
-using namespace std::string_literals;
-
 constexpr int firstPort = 21000;
 constexpr int lastPort = 31000;
 constexpr int blockSize = 1 << 18;
+constexpr int numbers[] = {0x01020304, -2, -2147483647 - 1};
 
-/// The fields as they must be on the wire, told byte by byte, and a block behind them.
-std::string expectedBytes() {
-    std::string bytes = "\4\3\2\1\xFE\xFF\xFF\xFF\0\0\0\x80\1\0\2\0\0\0ab\0\0\0\0"s;
+std::string block() {
+    std::string bytes;
     for (int i = 0; i < blockSize; ++i) {
         bytes += static_cast<char>((i * 31 + i / 4096) % 256);
     }
     return bytes;
 }
 
-class Conversation {
-public:
-    explicit Conversation(TessalSocket& transport) : m_transport(transport), m_socket(transport.getClientSocketFd()) {}
-
-    /// Field by field.
-    bool sendFields() {
-        int sent = 0;
-        for (const int number : {0x01020304, -2, -2147483647 - 1}) {
-            sent += m_transport.writeInt(m_socket, number);
-        }
-        return sent == 12 && m_transport.writeBool(m_socket, true) && m_transport.writeBool(m_socket, false) &&
-               m_transport.writeString(m_socket, "ab") == 2 && m_transport.writeString(m_socket, nullptr) == 0 &&
-               m_transport.writeSocket(block(), blockSize);
+bool sendFields(TessalSocket& end) {
+    const TessalSocket::Socket socket = end.getClientSocketFd();
+    int sent = 0;
+    for (const int number : numbers) {
+        sent += end.writeInt(socket, number);
     }
+    return sent == 12 && end.writeBool(socket, true) && end.writeBool(socket, false) &&
+           end.writeString(socket, "ab") == 2 && end.writeString(socket, nullptr) == 0 &&
+           end.writeSocket(block().data(), blockSize);
+}
 
-    /// The same, laid out in memory and sent whole.
-    bool sendBuffer() {
-        DataBuffer buffer(0);
-        for (const int number : {0x01020304, -2, -2147483647 - 1}) {
-            buffer.writeInt(number);
-        }
-        buffer.writeBool(true);
-        buffer.writeBool(false);
-        buffer.writeString("ab");
-        buffer.writeString(nullptr);
-        buffer.write(block(), blockSize);
-        return m_transport.writeSocket(buffer.getBuffer(), buffer.getLength());
-    }
-
-    bool readFields() {
-        bool matches = true;
-        for (const int number : {0x01020304, -2, -2147483647 - 1}) {
-            matches = matches && nextInt() == number;
-        }
-        bool first = false;
-        bool second = true;
-        matches = matches && m_transport.readBool(m_socket, &first) && m_transport.readBool(m_socket, &second);
-        matches = matches && first && !second && nextInt() == 2 && nextBytes(2) == "ab" && nextInt() == 0;
-        return matches && nextBytes(blockSize) == m_expected.substr(m_expected.size() - blockSize);
-    }
-
-    bool readBytes() { return nextBytes(static_cast<int>(m_expected.size())) == m_expected; }
-
-private:
-    const char* block() const { return m_expected.data() + m_expected.size() - blockSize; }
-
-    int nextInt() {
-        int value = 0;
-        m_transport.readInt(m_socket, &value);
-        return value;
-    }
-
-    std::string nextBytes(int length) {
-        std::string bytes(static_cast<std::size_t>(length), '\0');
-        return m_transport.read(m_socket, bytes.data(), length) ? bytes : "";
-    }
-
-    TessalSocket& m_transport;
-    TessalSocket::Socket m_socket;
-    std::string m_expected = expectedBytes();
-};
+bool readFields(TessalSocket& end) {
+    const TessalSocket::Socket socket = end.getClientSocketFd();
+    const auto isNext = [&](int number) {
+        int value = ~number;
+        end.readInt(socket, &value);
+        return value == number;
+    };
+    const auto isNextText = [&](const std::string& text) {
+        std::string bytes(text.size(), '\0');
+        return end.read(socket, bytes.data(), static_cast<int>(text.size())) && bytes == text;
+    };
+    bool first = false;
+    bool second = true;
+    return std::all_of(std::begin(numbers), std::end(numbers), isNext) && end.readBool(socket, &first) && first &&
+           end.readBool(socket, &second) && !second && isNext(2) && isNextText("ab") && isNext(0) &&
+           isNextText(block());
+}
 
 int outcome(bool isGood, const char* end) {
     std::printf("%s %s\n", end, isGood ? "ok" : "failed");
@@ -109,19 +75,14 @@ int serve() {
     std::printf("port %d\n", port);
     std::fflush(stdout);
     server->setClientSocketFd(server->acceptClient(nullptr, nullptr));
-    Conversation talk(*server);
-    const bool isGood = talk.readBytes() && talk.sendFields() && talk.readFields() && talk.sendBuffer();
+    const bool isGood = readFields(*server) && sendFields(*server);
     server->closeSocket(server->getClientSocketFd());
     return outcome(isGood, "server");
 }
 
 int ask(int port) {
     TessalSocket client(1, "127.0.0.1", port);
-    if (!client.connectToServer()) {
-        return outcome(false, "client");
-    }
-    Conversation talk(client);
-    return outcome(talk.sendFields() && talk.readBytes() && talk.sendBuffer() && talk.readFields(), "client");
+    return outcome(client.connectToServer() && sendFields(client) && readFields(client), "client");
 }
 
 }  // namespace
