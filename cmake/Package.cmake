@@ -34,22 +34,22 @@ else()
     set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS_POLICY ">=")
 
     function(tessal_debian_package component name section)
-        cmake_parse_arguments(PARSE_ARGV 3 package "" "DEPENDS;SUMMARY" "")
+        cmake_parse_arguments(PARSE_ARGV 3 package "" "DEPENDS;CONTENT" "")
         string(TOUPPER ${component} upper)
         set(CPACK_DEBIAN_${upper}_PACKAGE_NAME ${name} PARENT_SCOPE)
         set(CPACK_DEBIAN_${upper}_PACKAGE_SECTION ${section} PARENT_SCOPE)
-        set(CPACK_DEBIAN_${upper}_DESCRIPTION "${package_SUMMARY}" PARENT_SCOPE)
+        set(CPACK_DEBIAN_${upper}_DESCRIPTION "${package_CONTENT}" PARENT_SCOPE)
         set(CPACK_COMPONENT_${upper}_DEPENDS ${package_DEPENDS} PARENT_SCOPE)
         install(FILES LICENSE DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/${name} COMPONENT ${component} RENAME copyright)
     endfunction()
 
     # The name of the library's package ends in the number of its SONAME.
     tessal_debian_package(library libtessalutility${PROJECT_VERSION_MAJOR} libs
-                          SUMMARY "what the layers of a device-programming tool share")
+                          CONTENT "The shared library and its data files.")
     tessal_debian_package(development libtessalutility-dev libdevel DEPENDS library
-                          SUMMARY "what the layers of a device-programming tool share - headers")
+                          CONTENT "Headers, and what CMake, pkg-config and debuggers need.")
     tessal_debian_package(tools tessal-tools electronics DEPENDS library
-                          SUMMARY "batch prompt, simulated device and PROM file generator")
+                          CONTENT "Batch prompt, simulated device and PROM file generator.")
 endif()
 
 include(CPack)

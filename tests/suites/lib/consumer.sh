@@ -22,6 +22,15 @@ configure_shared() {
     quietly configure "$1" -DCMAKE_BUILD_TYPE=Release -DBUILD_SHARED_LIBS=ON -DTESSAL_TESTS=OFF -DTESSAL_EXAMPLES=OFF "${@:2}"
 }
 
+# make_packages [OPTION...]: a shared build with the tools, and its packages in the folder packages.
+make_packages() {
+    rm -rf "$installed" "$work/packages" "$work/consumer"
+    mkdir -p "$installed"
+    configure_shared "$work/library" -DTESSAL_EXAMPLES=ON "$@"
+    step "library and tools built" cmake --build "$work/library" --parallel "$jobs"
+    step "packages made" cpack --config "$work/library/CPackConfig.cmake" -B "$work/packages"
+}
+
 # build_consumer [OPTION...]: builds the consumer and runs its tests.
 build_consumer() {
     rm -rf "$work/consumer"
