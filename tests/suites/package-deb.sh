@@ -38,7 +38,9 @@ PATH=$installed/bin:$PATH
 unset TESSAL_DATA_PATH
 cd "$work"
 printf '\x12\xA5' >a.bin
-quietly tessal_batch "$installed/share/TessalUtility/examples/demo.batch"
+rm -rf demo
+cp -r "$installed/share/TessalUtility/examples" demo
+(cd demo && quietly tessal_batch demo.batch)
 quietly tessal_prom -generic -output boot -data a.bin
 expect "$(cat boot.mcs)" ':0200000048A511'
 expect "$(tessal_batch -c help erase)" 'Erase devices'

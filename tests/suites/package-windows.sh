@@ -22,7 +22,9 @@ export WINEPREFIX=$root/build/wine WINEDEBUG=-all WINEDLLOVERRIDES=mscoree,mshtm
 unset TESSAL_DATA_PATH
 cd "$work"
 printf '\x12\xA5' >a.bin
-quietly /usr/lib/wine/wine64 "$installed/bin/tessal_batch.exe" "$installed/share/TessalUtility/examples/demo.batch"
+rm -rf demo
+cp -r "$installed/share/TessalUtility/examples" demo
+(cd demo && quietly /usr/lib/wine/wine64 "$installed/bin/tessal_batch.exe" demo.batch)
 quietly /usr/lib/wine/wine64 "$installed/bin/tessal_prom.exe" -generic -output boot -data a.bin
 grep ':0200000048A511' boot.mcs >/dev/null
 echo "$archive: $(find "$installed" -type f | wc -l) files"
