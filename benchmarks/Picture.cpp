@@ -68,6 +68,7 @@ std::string legend() {
         result += box(x, 41, 16, mark.colour) + text(x + 22, 50, mark.words);
         x += 165;
     }
+    result += text(labelWidth + chartWidth + margin, headHeight - 12, "peer / limit");
     return result + line(x, 38, x, 53, "#111", 2) + text(x + 8, 50, "goal");
 }
 

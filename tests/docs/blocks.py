@@ -26,7 +26,7 @@ import textwrap
 
 ROOT, BUILD, SCRATCH = (pathlib.Path(argument).resolve() for argument in sys.argv[1:4])
 OPT = SCRATCH / "opt"
-FENCE = re.compile(r"^(?:<!-- suite: (?P<suites>.*) -->\n)?```(?P<language>\w*)\n(?P<text>.*?)^```$", re.M | re.S)
+FENCE = re.compile(r"^(?:<!-- suite: (?P<suites>[^>\n]*) -->\n)?```(?P<language>\w*)\n(?P<text>.*?)^```$", re.M | re.S)
 LIMIT = 600
 
 
@@ -57,8 +57,8 @@ def environment():
 
 def run(command, directory):
     """What a command prints; a failure when it fails."""
-    done = subprocess.run(command, cwd=directory, env=environment(), stdin=subprocess.DEVNULL, stdout=subprocess.PIPE,
-                          stderr=subprocess.STDOUT, text=True, timeout=LIMIT, check=False)
+    done = subprocess.run(["timeout", str(LIMIT), *command], cwd=directory, env=environment(), text=True, check=False,
+                          stdin=subprocess.DEVNULL, stdout=subprocess.PIPE, stderr=subprocess.STDOUT)
     if done.returncode != 0:
         raise Failure(f"status {done.returncode} of {command}:\n{done.stdout}")
     return done.stdout
@@ -142,7 +142,7 @@ class Shell:
 
     def ask(self, command, wanted):
         """What the command prints; one in the background prints as many lines as are wanted."""
-        self.process.stdin.write(f"{command}\nprintf '%s\\n' '=done='\n")
+        self.process.stdin.write(f"{command}\nstatus=$?; echo =done=; (exit $status)\n")
         self.process.stdin.flush()
         lines, is_done, is_behind = [], False, command.endswith("&")
         while not is_done or (is_behind and len(lines) < len(wanted)):
@@ -203,7 +203,7 @@ def main():
                     raise Failure(f"nothing tests a block of {block.language}")
                 CHECKS[block.language](block)
                 tested += block.language not in ("", "text")
-            except (Failure, subprocess.TimeoutExpired) as failure:
+            except Failure as failure:
                 print(f"{block}: {failure}\n{textwrap.indent(block.text, '    ')}", file=sys.stderr)
                 failures += 1
     print(f"{tested} blocks of code compiled or run")

@@ -9,4 +9,4 @@ source "$(dirname "${BASH_SOURCE[0]}")/lib/consumer.sh"
 rm -rf "$work"
 mkdir -p "$work"
 quietly tar -C "$root" -czf "$work/TessalUtility.tar.gz" --exclude=./build --exclude=./.git --exclude=./.cache .
-build_consumer -DTESSAL_ARCHIVE="$work/TessalUtility.tar.gz"
+build_consumer -DCMAKE_BUILD_TYPE=Debug -DTESSAL_ARCHIVE="$work/TessalUtility.tar.gz"

@@ -35,7 +35,7 @@ make_packages() {
 build_consumer() {
     rm -rf "$work/consumer"
     quietly cmake -S "$root/tests/consumer" -B "$work/consumer" -G Ninja -DCMAKE_BUILD_TYPE=Release \
-        -DCMAKE_PREFIX_PATH="$installed" "$@"
+        -DCMAKE_CXX_COMPILER_LAUNCHER="$(command -v ccache || true)" -DCMAKE_PREFIX_PATH="$installed" "$@"
     step "consumer built" cmake --build "$work/consumer" --parallel "$jobs"
     run_tests "$work/consumer"
 }
