@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # about: a program fetches the source, an archive on this disk, and builds it as a part of itself
 # needs:
-# limit: 600
+# limit: 900
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 source "$(dirname "${BASH_SOURCE[0]}")/lib/consumer.sh"

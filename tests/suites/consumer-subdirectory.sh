@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # about: a program builds the library as a part of itself, with a strange option or two of its own
 # needs: 
-# limit: 600
+# limit: 900
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 source "$(dirname "${BASH_SOURCE[0]}")/lib/consumer.sh"
