@@ -34,16 +34,9 @@ read -ra flags <<<"$(pkg-config --cflags --libs tessalutility)"
 quietly g++ -std=c++17 "$root/tests/consumer/main.cpp" "${flags[@]}" -o "$work/consumer/by-flags"
 quietly "$work/consumer/by-flags"
 
-PATH=$installed/bin:$PATH
-unset TESSAL_DATA_PATH
-cd "$work"
-printf '\x12\xA5' >a.bin
-rm -rf demo
-cp -r "$installed/share/TessalUtility/examples" demo
-(cd demo && quietly tessal_batch demo.batch)
-quietly tessal_prom -generic -output boot -data a.bin
-expect "$(cat boot.mcs)" ':0200000048A511'
-expect "$(tessal_batch -c help erase)" 'Erase devices'
+export installed work
+step "tools used" bash -c 'use_tools "$@"' use_tools
+expect "$("$installed/bin/tessal_batch" -c help erase)" 'Erase devices'
 bash -c 'source "$1" && complete -p tessal_batch' bash "$installed/share/bash-completion/completions/tessal_batch" >/dev/null
 for tool in tessal_batch tessal_device tessal_prom; do
     expect "$(MANPATH=$installed/share/man man "$tool" 2>&1)" "$tool"
@@ -51,4 +44,4 @@ done
 for folder in doc/$library/copyright zsh/site-functions/_tessal_batch fish/vendor_completions.d/tessal_batch.fish; do
     [ -f "$installed/share/$folder" ] || { echo "$folder is missing." >&2; exit 1; }
 done
-echo "$(cd packages && ls *.deb | paste -sd ' ')"
+echo "$(cd "$work/packages" && ls *.deb | paste -sd ' ')"

@@ -19,12 +19,6 @@ done
 build_consumer -DCMAKE_TOOLCHAIN_FILE="$root/cmake/mingw-w64.cmake" -DCMAKE_FIND_ROOT_PATH="$installed" -DCMAKE_RUNTIME_OUTPUT_DIRECTORY="$installed/bin"
 
 export WINEPREFIX=$root/build/wine WINEDEBUG=-all WINEDLLOVERRIDES=mscoree,mshtml=
-unset TESSAL_DATA_PATH
-cd "$work"
-printf '\x12\xA5' >a.bin
-rm -rf demo
-cp -r "$installed/share/TessalUtility/examples" demo
-(cd demo && quietly /usr/lib/wine/wine64 "$installed/bin/tessal_batch.exe" demo.batch)
-quietly /usr/lib/wine/wine64 "$installed/bin/tessal_prom.exe" -generic -output boot -data a.bin
-grep ':0200000048A511' boot.mcs >/dev/null
+export installed work
+step "tools used" bash -c 'use_tools "$@"' use_tools /usr/lib/wine/wine64
 echo "$archive: $(find "$installed" -type f | wc -l) files"

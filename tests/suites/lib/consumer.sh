@@ -39,3 +39,26 @@ build_consumer() {
     step "consumer built" cmake --build "$work/consumer" --parallel "$jobs"
     run_tests "$work/consumer"
 }
+
+# use_tools [EMULATOR...]: the installed tools, once each: the prompt asks a device, and the generator writes a file. No
+# data file is named to them.
+use_tools() (
+    set -euo pipefail
+    ending=${1:+.exe}
+    unset TESSAL_DATA_PATH
+    cd "$work"
+    : >address
+    timeout 120 "$@" "$installed/bin/tessal_device$ending" --tcp 0 >address 2>&1 </dev/null &
+    until grep tcp: address; do
+        sleep 0.1
+        kill -0 $!
+    done
+    address=$(tr -d '\r' <address)
+    timeout 60 "$@" "$installed/bin/tessal_batch$ending" - <<<"setcable -port $address"$'\n'identify | grep 'position 3: '
+    "$@" "$installed/bin/tessal_device$ending" --quit --tcp "${address#tcp:}"
+    wait $!
+    printf '\x12\xA5' >a.bin
+    "$@" "$installed/bin/tessal_prom$ending" -generic -output boot -data a.bin
+    grep :0200000048A511 boot.mcs
+)
+export -f use_tools
