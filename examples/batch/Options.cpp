@@ -3,6 +3,7 @@
 #include <TessalUtility.h>
 
 #include <algorithm>
+#include <cstdio>
 #include <iterator>
 
 namespace {
@@ -80,6 +81,10 @@ Options readOptions(int argc, char** argv) {
     options.hostRoot = args.text("--host-root", 0, "");
     options.stopOnError = args.isGiven("--stop-on-error");
     options.words.assign(words.begin() + static_cast<std::ptrdiff_t>(own), words.end());
+    if (options.task == Options::Task::RunCommand && options.words.empty()) {
+        std::fprintf(stderr, "%s: %s needs a command behind it\n", program, commandSwitch);
+        options.task = Options::Task::Refuse;
+    }
     return options;
 }
 

@@ -49,11 +49,11 @@ use_tools() (
     cd "$work"
     : >address
     timeout 120 "$@" "$installed/bin/tessal_device$ending" --tcp 0 >address 2>&1 </dev/null &
-    until grep tcp: address; do
+    until grep ^tcp: address; do
         sleep 0.1
         kill -0 $!
     done
-    address=$(tr -d '\r' <address)
+    address=$(tr -d '\r' <address | grep ^tcp:)
     timeout 60 "$@" "$installed/bin/tessal_batch$ending" - <<<"setcable -port $address"$'\n'identify | grep 'position 3: '
     "$@" "$installed/bin/tessal_device$ending" --quit --tcp "${address#tcp:}"
     wait $!
