@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # about: every block of code in README.md, CONTRIBUTING.md and docs/ is compiled or run
 # needs: python3=python3 mandoc=mandoc bsdextrautils=col
-# limit: 900
+# limit: 1500
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 
