@@ -10,6 +10,7 @@ const char* const usage =
     "  --rounds N          rounds in which the sides of an item run in turn (5)\n"
     "  --min-time SECONDS  least time of one side in a round (0.05)\n"
     "  --csv FILE          writes the table there, too\n"
+    "  --report FOLDER     writes benchmarks.md there, and pictures/benchmarks.svg below\n"
     "  --strict            exit status 1 when a goal is missed\n"
     "  --list              only the items' names\n";
 
@@ -29,6 +30,8 @@ void setValue(Options& options, const std::string& option, const std::string& va
         options.filter = value;
     } else if (option == "--csv") {
         options.csvFile = value;
+    } else if (option == "--report") {
+        options.reportFolder = value;
     } else if (option == "--rounds") {
         options.rounds.rounds = static_cast<int>(readNumber(option, value, 1, 1000));
     } else if (option == "--min-time") {

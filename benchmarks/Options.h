@@ -9,6 +9,7 @@ struct Options {
     RoundSettings rounds;
     std::string filter = ".*";  ///< a regular expression that some part of an item's name matches
     std::string csvFile;        ///< none: no file
+    std::string reportFolder;   ///< none: no page and no picture
     bool isStrict = false;      ///< a missed goal is a failure
     bool isList = false;
     bool isHelp = false;

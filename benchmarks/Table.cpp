@@ -1,17 +1,11 @@
 #include "Table.h"
 
-#include <cstdio>
+#include <algorithm>
+#include <array>
 #include <fstream>
 #include <thread>
 
 namespace {
-
-template <class... Values>
-std::string formatted(const char* format, Values... values) {
-    char text[512];
-    std::snprintf(text, sizeof text, format, values...);
-    return text;
-}
 
 // The processor's name where the host tells it.
 std::string processorName() {
@@ -45,7 +39,24 @@ const char* verdict(const Row& row) {
     return row.isMet() ? "met" : "missed";
 }
 
-constexpr const char* rowFormat = "%-*s %12s  %-28.28s %12s %7s %6s  %-28.28s %12s %7s %6s  %s\n";
+// Widths of the columns behind the item's name; a negative one starts at the left. Longer names are cut.
+constexpr std::array<int, 10> widths = {12, -28, 12, 7, 6, -28, 12, 7, 6, -6};
+
+std::string lineOf(const std::vector<std::string>& columns, std::size_t itemWidth) {
+    std::string line = formatted("%-*s", static_cast<int>(itemWidth), columns[0].c_str());
+    for (std::size_t i = 0; i < widths.size(); ++i) {
+        line += formatted(i == 1 || i == 5 || i == 9 ? "  %*.28s" : " %*.28s", widths[i], columns[i + 1].c_str());
+    }
+    line.erase(line.find_last_not_of(' ') + 1);
+    return line + "\n";
+}
+
+void addOpponent(std::vector<std::string>& columns, const Opponent& opponent) {
+    columns.push_back(opponent.isThere() ? opponent.name : "-");
+    columns.push_back(nanoseconds(opponent.nanoseconds, opponent.isThere()));
+    columns.push_back(number("%.2f", opponent.ratio, opponent.isThere()));
+    columns.push_back(number("%.2f", opponent.goal, opponent.isThere() && opponent.goal > 0));
+}
 
 std::string quoted(const std::string& text) {
     std::string result = "\"";
@@ -68,29 +79,44 @@ std::string csvOpponent(const Opponent& opponent) {
 
 }  // namespace
 
+std::string escaped(const std::string& text) {
+    std::string result;
+    for (const char ch : text) {
+        const char* const entity = ch == '<' ? "&lt;" : ch == '>' ? "&gt;" : ch == '&' ? "&amp;" : nullptr;
+        result += entity != nullptr ? entity : std::string(1, ch);
+    }
+    return result;
+}
+
 std::string describeMachine() {
     return processorName() + ", " + std::to_string(std::thread::hardware_concurrency()) + " threads; " +
-           TESSAL_BENCH_COMPILER + "; " + TESSAL_BENCH_BUILD_TYPE;
+           TESSAL_BENCH_SYSTEM + "; " + TESSAL_BENCH_COMPILER + "; " + TESSAL_BENCH_BUILD_TYPE;
+}
+
+std::string summary(const std::vector<Row>& rows) {
+    const auto failed = std::count_if(rows.begin(), rows.end(), [](const Row& row) { return !row.error.empty(); });
+    const auto missed = std::count_if(rows.begin(), rows.end(), [](const Row& row) { return !row.isMet(); });
+    return formatted("%zu items, %td with an error, %td with a missed goal", rows.size(), failed, missed);
+}
+
+std::vector<std::string> cells(const Row& row) {
+    std::vector<std::string> columns = {row.item, nanoseconds(row.oursNanoseconds, row.error.empty())};
+    addOpponent(columns, row.peer);
+    addOpponent(columns, row.limit);
+    columns.emplace_back(verdict(row));
+    return columns;
 }
 
 std::string textHeading(std::size_t itemWidth) {
-    return formatted(rowFormat, static_cast<int>(itemWidth), "item", "ours ns", "fastest peer", "ns", "ratio", "goal",
-                     "limit", "ns", "ratio", "goal", "goals");
+    return lineOf({"item", "ours ns", "fastest peer", "ns", "ratio", "goal", "limit", "ns", "ratio", "goal", "goals"},
+                  itemWidth);
 }
 
 std::string textRow(const Row& row, std::size_t itemWidth) {
     if (!row.error.empty()) {
         return formatted("%-*s error: ", static_cast<int>(itemWidth), row.item.c_str()) + row.error + "\n";
     }
-    const Opponent& peer = row.peer;
-    const Opponent& limit = row.limit;
-    return formatted(
-        rowFormat, static_cast<int>(itemWidth), row.item.c_str(), nanoseconds(row.oursNanoseconds, true).c_str(),
-        peer.isThere() ? peer.name.c_str() : "-", nanoseconds(peer.nanoseconds, peer.isThere()).c_str(),
-        number("%.2f", peer.ratio, peer.isThere()).c_str(),
-        number("%.2f", peer.goal, peer.isThere() && peer.goal > 0).c_str(), limit.isThere() ? limit.name.c_str() : "-",
-        nanoseconds(limit.nanoseconds, limit.isThere()).c_str(), number("%.2f", limit.ratio, limit.isThere()).c_str(),
-        number("%.2f", limit.goal, limit.isThere() && limit.goal > 0).c_str(), verdict(row));
+    return lineOf(cells(row), itemWidth);
 }
 
 std::string csv(const std::vector<Row>& rows) {

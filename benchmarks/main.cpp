@@ -1,11 +1,14 @@
 #include <algorithm>
 #include <cstdio>
 #include <exception>
+#include <filesystem>
 #include <fstream>
 #include <regex>
 
 #include "Options.h"
+#include "Picture.h"
 #include "Registry.h"
+#include "Report.h"
 #include "Table.h"
 
 namespace {
@@ -42,14 +45,21 @@ std::vector<Row> runAndShow(const std::vector<Item>& items, const RoundSettings&
     return rows;
 }
 
-bool writeCsv(const std::string& path, const std::vector<Row>& rows) {
-    std::ofstream file(path);
-    file << csv(rows);
+bool writeFile(const std::filesystem::path& path, const std::string& text) {
+    std::ofstream file(path, std::ios::binary);
+    file << text;
     file.close();
     if (!file) {
-        std::fprintf(stderr, "Cannot write %s.\n", path.c_str());
+        std::fprintf(stderr, "Cannot write %s.\n", path.string().c_str());
     }
     return static_cast<bool>(file);
+}
+
+bool writeFiles(const Options& options, const std::vector<Row>& rows) {
+    const std::filesystem::path folder(options.reportFolder);
+    return (options.csvFile.empty() || writeFile(options.csvFile, csv(rows))) &&
+           (folder.empty() || (writeFile(folder / "benchmarks.md", page(rows, options.rounds)) &&
+                               writeFile(folder / "pictures" / "benchmarks.svg", picture(rows))));
 }
 
 int run(const Options& options) {
@@ -65,11 +75,11 @@ int run(const Options& options) {
         return 2;
     }
     const std::vector<Row> rows = runAndShow(items, options.rounds);
-    const auto failed = std::count_if(rows.begin(), rows.end(), [](const Row& row) { return !row.error.empty(); });
-    const auto missed = std::count_if(rows.begin(), rows.end(), [](const Row& row) { return !row.isMet(); });
-    std::printf("\n%zu items, %td with an error, %td with a missed goal\n", rows.size(), failed, missed);
-    const bool isWritten = options.csvFile.empty() || writeCsv(options.csvFile, rows);
-    return failed > 0 || !isWritten || (options.isStrict && missed > 0) ? 1 : 0;
+    std::printf("\n%s\n", summary(rows).c_str());
+    const bool isWritten = writeFiles(options, rows);
+    const bool hasFailed = std::any_of(rows.begin(), rows.end(), [](const Row& row) { return !row.error.empty(); });
+    const bool isMet = std::all_of(rows.begin(), rows.end(), [](const Row& row) { return row.isMet(); });
+    return hasFailed || !isWritten || (options.isStrict && !isMet) ? 1 : 0;
 }
 
 }  // namespace

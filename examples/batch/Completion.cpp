@@ -3,7 +3,8 @@
 #include <TessalUtility.h>
 
 #include <memory>
-#include <vector>
+
+#include "Options.h"
 
 namespace {
 
@@ -24,14 +25,53 @@ CommandSet wordsOf(const std::string& line) {
     return words;
 }
 
+const char* formatOf(CommandSet& words) {
+    HkString command(words.getCommand(0));
+    command.MakeLower();
+    return TessalCmdargs::findBatchFormatString(command);
+}
+
 std::vector<HkString> candidatesFor(CommandSet& words) {
     if (words.getNumberCommands() == 1) {
         return TessalCmdargs::findMatchingCommands(words.getCommand(0));
     }
-    HkString command(words.getCommand(0));
-    command.MakeLower();
-    const char* const format = TessalCmdargs::findBatchFormatString(command);
-    return HkCmdArgs::complete(words.getNumberCommands(), words.getCommands(), format);
+    return HkCmdArgs::complete(words.getNumberCommands(), words.getCommands(), formatOf(words));
+}
+
+/// What a format says about one of its switches or words; empty for what is none, such as a value.
+std::string helpOn(const HkString& word, const char* format) {
+    for (const HkCmdArgInfo& argument : HkCmdArgs::describe(format)) {
+        for (const HkString& name : argument.names) {
+            if (name == word) {
+                return argument.help.c_str();
+            }
+        }
+    }
+    return {};
+}
+
+std::string commandsWithHelp(CommandSet& words) {
+    const bool isFirst = words.getNumberCommands() == 1;
+    std::string text;
+    for (const HkString& candidate : candidatesFor(words)) {
+        const std::string help = isFirst
+                                     ? HkCmdArgs::description(TessalCmdargs::findBatchFormatString(candidate)).c_str()
+                                     : helpOn(candidate, formatOf(words));
+        text += std::string(candidate) + "\t" + help + "\n";
+    }
+    return text;
+}
+
+std::string ownOptionsWithHelp(CommandSet& words) {
+    const bool isOption = words.getCommand(words.getNumberCommands() - 1)[0] == '-';
+    std::string text;
+    for (const HkString& option :
+         HkCmdArgs::complete(words.getNumberCommands(), words.getCommands(), optionsFormat())) {
+        if (isOption) {
+            text += std::string(option) + "\t" + helpOn(option, optionsFormat()) + "\n";
+        }
+    }
+    return text;
 }
 
 }  // namespace
@@ -47,6 +87,19 @@ std::string completionsOf(const std::string& line) {
         // Inside a quotation nothing can be known.
     }
     return text;
+}
+
+std::string completionsOf(const std::vector<std::string>& words) {
+    const std::size_t command = placeOfCommand(words) + 1;
+    const bool isCommand = command < words.size();
+    CommandSet typed;
+    if (!isCommand) {
+        typed.addCommand("tessal_batch");
+    }
+    for (std::size_t i = isCommand ? command : 0; i < words.size(); ++i) {
+        typed.addCommand(words[i].c_str());
+    }
+    return isCommand ? commandsWithHelp(typed) : ownOptionsWithHelp(typed);
 }
 
 bool isCompletionQuery(const std::string& line, std::string& asked) {

@@ -55,6 +55,17 @@ Status runScript(const std::string& script, bool stopOnError) {
     return runLines(file, script, stopOnError);
 }
 
+Status runCommand(const std::vector<std::string>& words) {
+    Messages messages("");
+    Session session(messages, true);
+    std::string line;
+    for (const std::string& word : words) {
+        const bool isPlain = !word.empty() && word.find_first_of(" \t") == std::string::npos;
+        line += (isPlain ? word : "\"" + word + "\"") + " ";
+    }
+    return session.take(line, 1) == Session::Outcome::Done ? AllFine : LinesRefused;
+}
+
 Status runPrompt(bool stopOnError) {
     std::puts("help lists the commands, quit ends, a tab before Enter shows how the line can go on.");
     Messages messages("");

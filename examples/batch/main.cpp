@@ -4,7 +4,6 @@
 
 #include <cstdio>
 #include <exception>
-#include <filesystem>
 
 #include "Completion.h"
 #include "Options.h"
@@ -12,16 +11,6 @@
 #include "Runner.h"
 
 namespace {
-
-/// Data files are taken from the directory given, or from the environment's; without both, from the source tree that
-/// the program was built in, as long as that is there, and then from where the library looks by itself.
-void chooseData(const std::string& directories) {
-    if (!directories.empty()) {
-        DeviceProfile::setDataPath(directories.c_str());
-    } else if (HkEnv::GetEnv("TESSAL_DATA_PATH") == nullptr && std::filesystem::exists(TESSAL_SOURCE_DATA)) {
-        DeviceProfile::setDataPath(TESSAL_SOURCE_DATA);
-    }
-}
 
 bool loadCommands() {
     try {
@@ -42,6 +31,11 @@ Status perform(const Options& options) {
         case Options::Task::Complete:
             std::fputs(completionsOf(options.line).c_str(), stdout);
             return AllFine;
+        case Options::Task::CompleteWords:
+            std::fputs(completionsOf(options.words).c_str(), stdout);
+            return AllFine;
+        case Options::Task::RunCommand:
+            return runCommand(options.words);
         case Options::Task::Prompt:
             return runPrompt(options.stopOnError);
         default:
@@ -58,7 +52,9 @@ Status run(int argc, char** argv) {
         std::fputs(optionsHelp().c_str(), stdout);
         return AllFine;
     }
-    chooseData(options.dataPath);
+    if (!options.dataPath.empty()) {
+        DeviceProfile::setDataPath(options.dataPath.c_str());
+    }
     CPortResources::setHostRoot(options.hostRoot.empty() ? nullptr : options.hostRoot.c_str());
     ProgressBar::install();
     return loadCommands() ? perform(options) : CannotRun;

@@ -1,13 +1,15 @@
 #!/usr/bin/env bash
-# about: the pictures are up to date, the reference builds without a warning, links between pages lead somewhere
-# needs: doxygen=doxygen python3=python3
+# about: the pictures are up to date, reference and man pages have no warning, links between pages lead somewhere
+# needs: doxygen=doxygen python3=python3 mandoc=mandoc
 # limit: 300
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
 
 draw_pictures() {
-    python3 "$root/docs/pictures/bits.py" "$root/build/docs/pictures"
-    local picture
+    local program picture
+    for program in "$root"/docs/pictures/*.py; do
+        python3 "$program" "$root/build/docs/pictures" || return
+    done
     for picture in "$root"/build/docs/pictures/*.svg; do
         diff -q "$picture" "$root/docs/pictures/" || return
     done
@@ -15,6 +17,7 @@ draw_pictures() {
 
 step "pictures" draw_pictures
 step "doxygen" bash -c "cd '$root' && doxygen docs/Doxyfile"
+step "man pages" mandoc -T lint -W warning "$root"/docs/man/*.1
 
 broken=0
 cd "$root"

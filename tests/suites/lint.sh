@@ -38,7 +38,7 @@ export -f compile_text
 xargs -P "$jobs" -I{} bash -c 'compile_text "#include \"{}\""' <<<"$expected" || complain "A header does not stand alone."
 compile_text "$(tac <<<"$expected" | sed 's/.*/#include "&"/')" || complain "The headers depend on their order."
 
-for script in run test .ci/run cmake/*.sh tests/suites/*.sh tests/suites/lib/*.sh; do
+for script in run test .ci/run cmake/*.sh tests/suites/*.sh tests/suites/lib/*.sh tests/*/*.sh examples/batch/completion/*.bash; do
     bash -n "$script" || complain "$script is no script."
 done
 
