@@ -10,7 +10,7 @@ constexpr const char* program = "tessal_batch";
 
 constexpr const char* format =
     "'Checks the lines of a batch script and carries them out. The exit status is 0 when all went well; 1 when lines "
-    "were refused; 2 when the call is wrong or a file cannot be read.'"
+    "were refused; 2 when the call is wrong or a file cannot be read; 130 after ^C.'"
     "{ <script=file> 'script to run; - reads standard input'"
     "  -i 'a prompt with help and completion'"
     "  --complete <line=text> 'print the words that can stand last in the line'"

@@ -4,10 +4,10 @@
 #include <string>
 
 /// Exit status of the program.
-enum Status { AllFine = 0, LinesRefused = 1, CannotRun = 2 };
+enum Status { AllFine = 0, LinesRefused = 1, CannotRun = 2, Interrupted = 130 };
 
 /// Runs a script, "-" being standard input, up to its end, the command that ends the run or, with @p stopOnError, the
-/// first line that is refused.
+/// first line that is refused. ^C ends it between two steps, with all given back.
 Status runScript(const std::string& script, bool stopOnError);
 
 /// Asks a person for lines. Who types has seen each message, so lines that were refused do not count at the end.

@@ -7,6 +7,7 @@
 #include <filesystem>
 
 #include "Completion.h"
+#include "Interruption.h"
 #include "Options.h"
 #include "ProgressBar.h"
 #include "Runner.h"
@@ -61,6 +62,7 @@ Status run(int argc, char** argv) {
     chooseData(options.dataPath);
     CPortResources::setHostRoot(options.hostRoot.empty() ? nullptr : options.hostRoot.c_str());
     ProgressBar::install();
+    Interruption::arm();
     return loadCommands() ? perform(options) : CannotRun;
 }
 
