@@ -1,18 +1,18 @@
 #!/usr/bin/env bash
 # The demonstration: a simulated device in a process of its own, and the batch prompt that programs it.
 #
-#     demonstrate.sh BATCH DEVICE EMULATOR [--tcp] [OPTION...]
+#     demonstrate.sh BATCH DEVICE [--tcp] [OPTION...]
 #
-# EMULATOR starts the two programs where they are of another host, "" where not. The options are those of the device,
-# for faults. The files go to a temporary directory. The exit status is the prompt's, or 1 when what was read back is
-# not what was programmed.
+# The options are those of the device, for faults. The files go to a temporary directory. The exit status is the
+# prompt's, or 1 when what was read back is not what was programmed. TESSAL_EMULATOR in the environment is the command
+# that starts programs of another host.
 set -euo pipefail
 
 here=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd)
-read -ra emulator <<<"$3"
+read -ra emulator <<<"${TESSAL_EMULATOR-}"
 batch=("${emulator[@]}" "$1")
 device=("${emulator[@]}" "$2")
-shift 3
+shift 2
 
 work=$(mktemp -d)
 served=
@@ -43,9 +43,9 @@ for ((tries = 0; tries < 500; ++tries)); do
     kill -0 "$served" 2>/dev/null || break
     sleep 0.02
 done
-TESSAL_DEVICE=$(tr -d '\r' <address)
+TESSAL_DEVICE=$(sed -nE 's/\r$//; /^(pipe|tcp):/p' address)
 export TESSAL_DEVICE
-[[ $TESSAL_DEVICE =~ ^(pipe|tcp): ]] || { echo "The device does not serve: $TESSAL_DEVICE" >&2; exit 2; }
+[[ $TESSAL_DEVICE =~ ^(pipe|tcp): ]] || { echo "The device does not serve: $(cat address)" >&2; exit 2; }
 
 status=0
 "${batch[@]}" demo.batch || status=$?

@@ -34,7 +34,6 @@ bool takePort(Session& session, const std::string& port) {
 }  // namespace
 
 bool setCable(Session& session, const HkCmdArgs& args) {
-    session.leaveCable();
     const char* speed = nullptr;
     if (args.isGiven("-speed")) {
         speed = CableInfo::getDisplaySpeedString(static_cast<int>(args.integer("-speed")));
@@ -42,6 +41,7 @@ bool setCable(Session& session, const HkCmdArgs& args) {
             return false;  // the message has gone out
         }
     }
+    session.leaveCable();
     const std::string port = chosenPort(args.text("-port", 0, ""));
     if (!port.empty() && !takePort(session, port)) {
         return false;
