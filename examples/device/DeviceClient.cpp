@@ -9,14 +9,6 @@ namespace {
 constexpr int attempts = 100;
 constexpr std::chrono::milliseconds pauseBetweenAttempts{20};
 
-std::unique_ptr<TessalPipe> pipeTo(const DeviceAddress& address) {
-    return address.pipe.empty() ? nullptr : std::make_unique<TessalPipe>(1, address.pipe.c_str());
-}
-
-std::unique_ptr<TessalSocket> socketTo(const DeviceAddress& address) {
-    return address.pipe.empty() ? std::make_unique<TessalSocket>(1, "127.0.0.1", address.port) : nullptr;
-}
-
 bool connect(TessalPipe& client) {
     for (int left = attempts; left > 0; --left) {
         if (client.initialize()) {
@@ -45,10 +37,10 @@ const char* textOf(int result) {
 }  // namespace
 
 DeviceClient::DeviceClient(const DeviceAddress& address)
-    : m_pipe(pipeTo(address)),
-      m_socket(socketTo(address)),
-      m_link(m_pipe != nullptr ? DeviceLink(*m_pipe) : DeviceLink(*m_socket)),
-      m_isConnected(m_pipe != nullptr ? connect(*m_pipe) : m_socket->connectToServer()) {}
+    : m_pipe(1, address.pipe.c_str()),
+      m_socket(1, "127.0.0.1", address.port),
+      m_link(address.pipe.empty() ? DeviceLink(m_socket) : DeviceLink(m_pipe)),
+      m_isConnected(address.pipe.empty() ? m_socket.connectToServer() : connect(m_pipe)) {}
 
 bool DeviceClient::identify(std::vector<ChainDevice>& devices) {
     DeviceRequest request(DeviceRequest::Identify);

@@ -3,7 +3,6 @@
 
 #include <TessalUtility.h>
 
-#include <memory>
 #include <string>
 #include <vector>
 
@@ -33,8 +32,8 @@ private:
     bool isDone(const DeviceAnswer& answer, int expectedLength);
     bool lose();
 
-    std::unique_ptr<TessalPipe> m_pipe;  ///< one of the two
-    std::unique_ptr<TessalSocket> m_socket;
+    TessalPipe m_pipe;  ///< one of the two is used
+    TessalSocket m_socket;
     DeviceLink m_link;
     bool m_isConnected;
     std::string m_failure;
