@@ -1,15 +1,20 @@
-// The commands that choose a device and ask it.
+// The commands that work on the devices of the chain.
+//
+// The chain is that which serves at the cable's port or, without one, at the address in the environment variable
+// TESSAL_DEVICE. Without either, a line is only checked.
 #pragma once
 
 #include <TessalUtility.h>
 
 class Session;
 
-/// Remembers the device where the port is one: "pipe:NAME" or "tcp:PORT". Any other port is taken for this process, or
-/// it is told who is in the way; "auto" is the port of the preference for cables.
-bool setCable(Session& session, const HkCmdArgs& args);
-/// Forgets the device and gives the port back.
-bool closeCable(Session& session, const HkCmdArgs& args);
-/// Lists the devices of the chain that serves at the cable's port or, without one, at the address in the environment
-/// variable TESSAL_DEVICE.
+/// Lists the devices.
 bool identify(Session& session, const HkCmdArgs& args);
+/// Remembers the file of a position; it is read when it is needed.
+bool assignFile(Session& session, const HkCmdArgs& args);
+bool erase(Session& session, const HkCmdArgs& args);
+/// Programs the assigned files, after an erasure with -e; -v compares afterwards.
+bool program(Session& session, const HkCmdArgs& args);
+bool verify(Session& session, const HkCmdArgs& args);
+/// Writes as many bytes as the assigned file has, all of the PROM where none is assigned.
+bool readback(Session& session, const HkCmdArgs& args);

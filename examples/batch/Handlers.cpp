@@ -3,6 +3,7 @@
 #include <cstdio>
 #include <cstring>
 
+#include "CableCommands.h"
 #include "DeviceCommands.h"
 #include "Help.h"
 #include "HostCommands.h"
@@ -38,20 +39,21 @@ struct Row {
 };
 
 constexpr Row rows[] = {
+    {"assignfile", assignFile},
     {"checksum", checksum},
     {"closecable", closeCable},
     {"custcode", showOptions},
-    {"erase", showOptions},
+    {"erase", erase},
     {"generate", generate},
     {"help", help},
     {"identify", identify},
     {"info", info},
     {"preference", preference},
-    {"program", showOptions},
+    {"program", program},
     {"quit", quit},
-    {"readback", showOptions},
+    {"readback", readback},
     {"setcable", setCable},
-    {"verify", showOptions},
+    {"verify", verify},
 };
 
 }  // namespace

@@ -5,15 +5,17 @@
 #include <cstdio>
 #include <filesystem>
 #include <fstream>
-#include <iterator>
 #include <optional>
 #include <string>
 #include <system_error>
 #include <vector>
 
 #include "ByteProgress.h"
+#include "Chain.h"
+#include "DataFile.h"
 #include "Quoting.h"
 #include "Session.h"
+#include "Verify.h"
 
 namespace {
 
@@ -53,10 +55,7 @@ struct Content {
 
 /// What keeps a file from being summed; empty where nothing does.
 std::string measure(Content& content, std::optional<std::uint64_t> promSize) {
-    const char* const texts[] = {"mcs", "exo", "tek", "hex", "elf", "mem"};
-    const char* const extension = HkPath::GetExt(content.path.c_str(), nullptr);
-    if (std::any_of(std::begin(texts), std::end(texts),
-                    [=](const char* text) { return HkStr::ICompare(extension, text) == 0; })) {
+    if (isTextFormat(content.path)) {
         return "is no binary file; generate -format bin writes one";
     }
     std::error_code error;
@@ -136,6 +135,9 @@ bool checksum(Session& session, const HkCmdArgs& args) {
     std::optional<unsigned int> expected;
     if (args.isGiven("-expect")) {
         expected = args.hex("-expect");
+    }
+    if (args.isGiven("-p")) {
+        return forEachProm(session, args, [&](Prom& prom) { return sumProm(prom, expected); });
     }
     bool isGood = true;
     for (const HkString& path : args.list("-file")) {

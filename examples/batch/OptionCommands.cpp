@@ -40,12 +40,12 @@ void showPreference(TessalPreference& preferences, TessalPreference::PREFERENCE 
 
 }  // namespace
 
-bool showOptions(Session&, const HkCmdArgs& args) {
+DeviceOptionsMgr takeOptions(const HkCmdArgs& args) {
+    DeviceOptionsMgr manager;
     const Operation* const operation = findOperation(args.command());
     if (operation == nullptr) {
-        return true;
+        return manager;
     }
-    DeviceOptionsMgr manager;
     DeviceOptionReader(args, tESSALNS::programOptionRows, manager).read(operation->first, operation->last);
     const std::vector<HkString> options = (manager.*operation->options)();
     std::string line = "  options:";
@@ -53,6 +53,11 @@ bool showOptions(Session&, const HkCmdArgs& args) {
         line += ' ' + quotedWhereNeeded(option.view());
     }
     std::printf("%s\n", options.empty() ? "  options: none" : line.c_str());
+    return manager;
+}
+
+bool showOptions(Session&, const HkCmdArgs& args) {
+    takeOptions(args);
     return true;
 }
 

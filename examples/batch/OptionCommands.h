@@ -6,6 +6,8 @@
 class Session;
 
 /// Sets the options of the device operation that the command names and shows the arguments that they make.
+DeviceOptionsMgr takeOptions(const HkCmdArgs& args);
+/// The same, for an operation that is only checked.
 bool showOptions(Session& session, const HkCmdArgs& args);
 /// Lists the preferences, shows one or sets one.
 bool preference(Session& session, const HkCmdArgs& args);

@@ -15,7 +15,7 @@ constexpr const char* completeWords = "--complete-words";
 
 constexpr const char* format =
     "'Checks the lines of a batch script and carries them out. The exit status is 0 when all went well; 1 when lines "
-    "were refused; 2 when the call is wrong or a file cannot be read.'"
+    "were refused; 2 when the call is wrong or a file cannot be read; 130 after ^C.'"
     "{ <script=file> 'script to run; - reads standard input'"
     "  -i 'a prompt with help and completion'"
     "  -c 'run the one command that all words behind this one make'"

@@ -1,6 +1,20 @@
 #include "PortLock.h"
 
 #include <algorithm>
+#include <cstdint>
+
+namespace {
+
+/// A port id of its own for each address, above those of all real ports.
+int deviceId(const std::string& address) {
+    std::uint32_t hash = 2166136261;
+    for (const char ch : address) {
+        hash = (hash ^ static_cast<unsigned char>(ch)) * 16777619;
+    }
+    return 1000000 + static_cast<int>(hash % 1000000000);
+}
+
+}  // namespace
 
 bool PortLock::take(const char* displayName) {
     giveBack();
@@ -9,21 +23,25 @@ bool PortLock::take(const char* displayName) {
         m_failure = "there is no such port";
         return false;
     }
-    return attach(genericName, std::max(CableInfo::getPortNumber(displayName), 0));
+    const int number = std::max(CableInfo::getPortNumber(displayName), 0);
+    return attach(Access::generatePortId(genericName, number, Access::SHARE),
+                  Access::generatePortId(genericName, number, Access::COUNT));
+}
+
+bool PortLock::takeDevice(const std::string& address) {
+    giveBack();
+    return attach(deviceId(address), deviceId(address));  // the two kinds have names of their own
 }
 
 /// Counts itself in, then takes the port; counts itself out again where another one has it.
-bool PortLock::attach(const char* genericName, int number) {
-    const auto semaphore = [=](Access::ACCESS_TYPE type) {
-        return std::make_unique<Access>(Access::generatePortId(genericName, number, type), type);
-    };
-    m_counter = semaphore(Access::COUNT);
+bool PortLock::attach(int holderId, int counterId) {
+    m_counter = std::make_unique<Access>(counterId, Access::COUNT);
     if (m_counter->decCount() == 0) {
         m_counter.reset();
         m_failure = "all places at the port are taken";
         return false;
     }
-    m_holder = semaphore(Access::SHARE);
+    m_holder = std::make_unique<Access>(holderId, Access::SHARE);
     if (m_holder->lock()) {
         return true;
     }

@@ -11,20 +11,25 @@
 class PortLock {
 public:
     PortLock() = default;
-    PortLock(const PortLock&) = delete;
-    PortLock& operator=(const PortLock&) = delete;
+    PortLock(PortLock&&) = default;
+    PortLock& operator=(PortLock&&) = delete;
     ~PortLock() { giveBack(); }
 
-    /// Takes the port that the display name tells, such as "usb2" or "LPT1", in place of the former one. False where
-    /// it is no port, where all places at it are taken, or where another process holds it; failure() then says which.
+    // Each takes a port in place of the former one. False where all places at it are taken, or where another process
+    // holds it; failure() then says which.
+
+    /// Takes the port that the display name tells, such as "usb2" or "LPT1"; false also where it is none.
     bool take(const char* displayName);
+    /// Takes the port that a simulated device is, by its address.
+    bool takeDevice(const std::string& address);
+
     void giveBack();
     bool isTaken() const { return m_holder != nullptr; }
 
     const std::string& failure() const { return m_failure; }
 
 private:
-    bool attach(const char* genericName, int number);
+    bool attach(int holderId, int counterId);
 
     std::unique_ptr<Access> m_holder;
     std::unique_ptr<Access> m_counter;

@@ -5,6 +5,7 @@
 #include <iostream>
 
 #include "Completion.h"
+#include "Interruption.h"
 #include "LineSource.h"
 #include "Messages.h"
 #include "Session.h"
@@ -18,15 +19,23 @@ Status summarise(const Session& session, int lines) {
     return session.count(Outcome::Refused) == 0 ? AllFine : LinesRefused;
 }
 
+bool goesOn(const Session& session) {
+    return !session.hasEnded() && !Interruption::isWanted();
+}
+
 Status runLines(std::istream& stream, const std::string& name, bool stopOnError) {
     Messages messages(name);
     Session session(messages, false);
     LineSource source(stream);
     std::string line;
-    while (!session.hasEnded() && source.next(line)) {
+    while (goesOn(session) && source.next(line)) {
         if (session.take(line, source.number()) == Session::Outcome::Refused && stopOnError) {
             break;
         }
+    }
+    if (Interruption::isWanted()) {
+        messages.sayOfAll("interrupted");
+        return Interrupted;
     }
     if (source.hasFailed()) {
         messages.sayOfAll("cannot be read");
@@ -72,7 +81,7 @@ Status runPrompt(bool stopOnError) {
     Session session(messages, true);
     LineSource source(std::cin);
     std::string line;
-    while (!session.hasEnded() && askForLine(source, line)) {
+    while (goesOn(session) && askForLine(source, line)) {
         std::string asked;
         if (isCompletionQuery(line, asked)) {
             std::fputs(completionsOf(asked).c_str(), stdout);
@@ -83,5 +92,5 @@ Status runPrompt(bool stopOnError) {
     if (!session.hasEnded()) {
         std::puts("");
     }
-    return AllFine;
+    return Interruption::isWanted() ? Interrupted : AllFine;
 }

@@ -67,6 +67,11 @@ void Session::show(const std::string& echo) const {
     std::fputs(echo.c_str(), stdout);
 }
 
+void Session::leaveCable() {
+    m_port.giveBack();
+    m_device.clear();
+}
+
 void Session::sayUnknown(const char* word) const {
     const std::vector<HkString> known = TessalCmdargs::findAllCommands();
     const char* const nearest = HkCmdArgs::nearest(word, known);

@@ -4,6 +4,7 @@
 #include <TessalUtility.h>
 
 #include <array>
+#include <map>
 #include <string>
 
 #include "Messages.h"
@@ -44,6 +45,11 @@ public:
 
     /// The port of the cable.
     PortLock& port() { return m_port; }
+    /// Gives the port back and forgets the device.
+    void leaveCable();
+
+    /// The file that the device at a position is programmed with; empty for none.
+    std::string& assignedFile(int position) { return m_files[position]; }
 
 private:
     Outcome takeText(const std::string& text);
@@ -57,5 +63,6 @@ private:
     CommandSet* m_tokens = nullptr;
     std::string m_device;
     PortLock m_port;
+    std::map<int, std::string> m_files;
     std::array<int, 4> m_counts{};
 };

@@ -6,6 +6,7 @@
 #include <exception>
 
 #include "Completion.h"
+#include "Interruption.h"
 #include "Options.h"
 #include "ProgressBar.h"
 #include "Runner.h"
@@ -57,6 +58,7 @@ Status run(int argc, char** argv) {
     }
     CPortResources::setHostRoot(options.hostRoot.empty() ? nullptr : options.hostRoot.c_str());
     ProgressBar::install();
+    Interruption::arm();
     return loadCommands() ? perform(options) : CannotRun;
 }
 

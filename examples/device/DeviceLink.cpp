@@ -1,20 +1,14 @@
 #include "DeviceLink.h"
 
-#include <chrono>
 #include <cstdlib>
 #include <locale>
 #include <sstream>
-#include <thread>
 
 namespace {
 
 constexpr int longestMessage = 64 * 1024;
 constexpr int highestPort = 65535;
 constexpr char pipePrefix[] = "\\\\.\\pipe\\";
-
-// A device that has just lost a client makes its pipe anew.
-constexpr int attempts = 100;
-constexpr std::chrono::milliseconds pauseBetweenAttempts{20};
 
 bool startsWith(const std::string& text, const char* start) {
     return text.rfind(start, 0) == 0;
@@ -36,21 +30,6 @@ std::optional<DeviceAddress> readPort(const std::string& digits) {
     return isNumber && digits.size() <= 5 && address.port <= highestPort ? std::optional(address) : std::nullopt;
 }
 
-bool ask(DeviceLink link, DeviceRequest::Kind kind, ChainAnswer& answer) {
-    DeviceRequest request(kind);
-    return link.send(request) && link.receive(answer) && answer.getId() == kind;
-}
-
-bool connect(TessalPipe& client) {
-    for (int left = attempts; left > 0; --left) {
-        if (client.initialize()) {
-            return true;
-        }
-        std::this_thread::sleep_for(pauseBetweenAttempts);
-    }
-    return false;
-}
-
 }  // namespace
 
 std::optional<DeviceAddress> DeviceAddress::read(const std::string& text) {
@@ -67,13 +46,14 @@ std::string DeviceAddress::text() const {
     return "pipe:" + (startsWith(pipe, pipePrefix) ? pipe.substr(sizeof pipePrefix - 1) : pipe);
 }
 
-bool DeviceLink::send(NetMessage& message) {
+bool DeviceLink::send(NetMessage& message, const unsigned char* block, int length) {
     std::ostringstream form;
     form.imbue(std::locale::classic());
     message.writeStream(form);
     const std::string text = form.str();
-    DataBuffer buffer(static_cast<int>(text.size()) + 4);
+    DataBuffer buffer(static_cast<int>(text.size()) + WireForm::intSize + length);
     buffer.writeString(text.c_str());
+    buffer.write(reinterpret_cast<const char*>(block), length);
     return m_mux.writeSocket(buffer.getBuffer(), buffer.getLength());
 }
 
@@ -93,11 +73,6 @@ bool DeviceLink::receive(NetMessage& message) {
     return !form.fail();
 }
 
-bool askDevice(const DeviceAddress& address, DeviceRequest::Kind kind, ChainAnswer& answer) {
-    if (!address.pipe.empty()) {
-        TessalPipe client(1, address.pipe.c_str());
-        return connect(client) && ask(DeviceLink(client), kind, answer);
-    }
-    TessalSocket client(1, "127.0.0.1", address.port);
-    return client.connectToServer() && ask(DeviceLink(client), kind, answer);
+bool DeviceLink::receiveBlock(unsigned char* block, int length) {
+    return m_mux.read(reinterpret_cast<char*>(block), length);
 }

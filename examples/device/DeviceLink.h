@@ -6,8 +6,6 @@
 #include <optional>
 #include <string>
 
-#include "DeviceMessages.h"
-
 /// Where a device serves: "pipe:NAME", or "tcp:PORT" on this machine.
 struct DeviceAddress {
     /// Nothing where the text is neither form. Port 0 stands for any free one, and is for a server.
@@ -18,19 +16,19 @@ struct DeviceAddress {
     int port = 0;
 };
 
-/// Messages over one connection. A message is a string of the wire form that holds the record's text.
+/// Messages over one connection. A message is a string of the wire form that holds the record's text; the bytes of a
+/// block may follow it.
 class DeviceLink {
 public:
     explicit DeviceLink(TessalSocket& socket) : m_mux(false) { m_mux.setSocketHandle(&socket); }
     explicit DeviceLink(TessalPipe& pipe) : m_mux(true) { m_mux.setPipeHandle(&pipe); }
 
-    bool send(NetMessage& message);
-    /// False where the peer is gone, announces more than 64 KiB, or sends another record.
+    /// Sends the message and what follows it at once: two transfers would wait for the peer's acknowledgement.
+    bool send(NetMessage& message, const unsigned char* block = nullptr, int length = 0);
+    /// False where the peer is gone, announces more than a message can hold, or sends another record.
     bool receive(NetMessage& message);
+    bool receiveBlock(unsigned char* block, int length);
 
 private:
     TessalPortMux m_mux;
 };
-
-/// Connects, asks and takes the answer, on a connection of its own; false, with messages, where that fails.
-bool askDevice(const DeviceAddress& address, DeviceRequest::Kind kind, ChainAnswer& answer);

@@ -9,6 +9,26 @@ constexpr int longestChain = 64;
 
 }  // namespace
 
+void DeviceRequest::readStream(std::istream& in) {
+    NetMessage::readStream(in);
+    in >> position >> offset >> length;
+}
+
+void DeviceRequest::writeStream(std::ostream& out) {
+    NetMessage::writeStream(out);
+    out << position << '\n' << offset << '\n' << length << '\n';
+}
+
+void DeviceAnswer::readStream(std::istream& in) {
+    NetMessage::readStream(in);
+    in >> result >> length;
+}
+
+void DeviceAnswer::writeStream(std::ostream& out) {
+    NetMessage::writeStream(out);
+    out << result << '\n' << length << '\n';
+}
+
 void ChainAnswer::readStream(std::istream& in) {
     NetMessage::readStream(in);
     int count = 0;

@@ -3,11 +3,11 @@
 #include <TessalUtility.h>
 
 #include <cstdio>
-#include <cstring>
+#include <exception>
 #include <memory>
-#include <optional>
 
-#include "DeviceLink.h"
+#include "DeviceCall.h"
+#include "DeviceClient.h"
 
 namespace {
 
@@ -16,36 +16,6 @@ constexpr int lastFreePort = 32000;
 
 /// A client may be gone before it is let in; so many in a row mean that something else is wrong.
 constexpr int mostFailures = 100;
-
-constexpr char usage[] =
-    "usage: tessal_device [--quit] --pipe NAME | --tcp PORT\n"
-    "  --pipe NAME  serve over a pipe of this name\n"
-    "  --tcp PORT   serve on this port; 0 takes a free one\n"
-    "  --quit       end the device that serves there\n"
-    "The address is printed when the device is ready, in the form that setcable -port takes.\n";
-
-ChainAnswer chain() {
-    ChainAnswer answer(DeviceRequest::Identify);
-    answer.devices = {{"sim-prom-4m", 0x05045093}, {"sim-prom-16m", 0x05046093}, {"sim-logic", 0x02A20093}};
-    return answer;
-}
-
-/// Serves a client until it closes, fails or says something else; true when it asked for the end.
-bool serveClient(DeviceLink link) {
-    DeviceRequest request;
-    while (link.receive(request)) {
-        ChainAnswer answer(request.getId());
-        if (request.getId() == DeviceRequest::Identify) {
-            answer = chain();
-        } else if (request.getId() != DeviceRequest::Quit) {
-            answer = ChainAnswer();
-        }
-        if (!link.send(answer) || request.getId() == DeviceRequest::Quit) {
-            break;
-        }
-    }
-    return request.getId() == DeviceRequest::Quit;
-}
 
 /// Clients come and go: what their connections report is of no interest here.
 void beReady(const DeviceAddress& address) {
@@ -66,7 +36,7 @@ std::unique_ptr<TessalSocket> listenAt(DeviceAddress& address) {
     return nullptr;
 }
 
-bool serveTcp(DeviceAddress address) {
+bool serveTcp(DeviceAddress address, SimulatedChain& chain) {
     const std::unique_ptr<TessalSocket> server = listenAt(address);
     if (server == nullptr) {
         return false;
@@ -78,7 +48,8 @@ bool serveTcp(DeviceAddress address) {
             continue;
         }
         server->setClientSocketFd(client);
-        const bool hasEnded = serveClient(DeviceLink(*server));
+        DeviceLink link(*server);
+        const bool hasEnded = chain.serve(link);
         server->closeSocket(client);
         if (hasEnded) {
             return true;
@@ -88,7 +59,7 @@ bool serveTcp(DeviceAddress address) {
     return false;
 }
 
-bool servePipe(const DeviceAddress& address) {
+bool servePipe(const DeviceAddress& address, SimulatedChain& chain) {
     bool isReady = false;
     for (int failures = 0; failures < mostFailures; ++failures) {
         TessalPipe server(0, address.pipe.c_str());  // an end is for one client
@@ -103,7 +74,8 @@ bool servePipe(const DeviceAddress& address) {
         if (!server.waitForClient()) {
             continue;
         }
-        if (serveClient(DeviceLink(server))) {
+        DeviceLink link(server);
+        if (chain.serve(link)) {
             return true;
         }
         failures = 0;
@@ -111,39 +83,32 @@ bool servePipe(const DeviceAddress& address) {
     return false;
 }
 
-/// What the command line asks for; no address where it does not fit.
-struct Call {
-    std::optional<DeviceAddress> address;
-    bool quits = false;
-};
-
-Call readCall(int argc, char** argv) {
-    Call call;
-    int next = 1;
-    if (next < argc && std::strcmp(argv[next], "--quit") == 0) {
-        call.quits = true;
-        ++next;
+int run(int argc, char** argv) {
+    const DeviceCall call = readDeviceCall(argc, argv);
+    if (call.isHelp) {
+        std::fputs(deviceCallHelp().c_str(), stdout);
+        return 0;
     }
-    if (argc - next == 2 && std::strcmp(argv[next], "--pipe") == 0) {
-        call.address = DeviceAddress::read("pipe:" + std::string(argv[next + 1]));
-    } else if (argc - next == 2 && std::strcmp(argv[next], "--tcp") == 0) {
-        call.address = DeviceAddress::read("tcp:" + std::string(argv[next + 1]));
+    if (!call.address) {
+        return 2;
     }
-    return call;
+    if (call.isQuit) {
+        DeviceClient device(*call.address);
+        return device.isConnected() && device.quit() ? 0 : 1;
+    }
+    SimulatedChain chain(call.contentFile, call.faults);
+    const bool hasServed =
+        call.address->pipe.empty() ? serveTcp(*call.address, chain) : servePipe(*call.address, chain);
+    return hasServed ? 0 : 1;
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
-    const Call call = readCall(argc, argv);
-    if (!call.address) {
-        std::fputs(usage, stderr);
-        return 2;
+    try {
+        return run(argc, argv);
+    } catch (const std::exception& exception) {
+        std::fprintf(stderr, "tessal_device: %s\n", exception.what());
+        return 1;
     }
-    if (call.quits) {
-        ChainAnswer answer;
-        return askDevice(*call.address, DeviceRequest::Quit, answer) ? 0 : 1;
-    }
-    const bool hasServed = call.address->pipe.empty() ? serveTcp(*call.address) : servePipe(*call.address);
-    return hasServed ? 0 : 1;
 }

@@ -20,8 +20,11 @@ await() {
     exit 1
 }
 
+# A second prompt is told this.
 second() {
-    printf 'setcable -port lpt20\n' | "$program" --data "$data" - 2>&1 || true
+    local printed
+    printed=$("$program" --data "$data" - <<<'setcable -port lpt20' 2>&1) || true
+    grep -q "$1" <<<"$printed" || { echo "The second prompt said: $printed" >&2; exit 1; }
 }
 
 mkfifo "$folder/typed"
@@ -30,8 +33,8 @@ exec 9>"$folder/typed"
 echo 'setcable -port lpt20' >&9
 await 'port taken'
 
-second | grep -q 'the port is in use by another process; 1 other client is attached'
+second 'the port is in use by another process; 1 other client is attached'
 echo 'closecable' >&9
 await 'port given back'
-second | grep -q 'port taken'
+second 'port taken'
 echo 'quit' >&9
