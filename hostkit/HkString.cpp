@@ -78,7 +78,7 @@ std::uint32_t indexOrNone(std::size_t index) {
 // A short text has a small block of its own, which costs less to copy than a count shared by threads; a long text is
 // shared and counted. Which of both it is shows in its capacity.
 
-HkString::EmptyText HkString::s_empty{{{0}, 0, 0, 0}, '\0'};
+HkString::EmptyText HkString::s_empty{{{0}, 0, 0, 0}, ""};
 
 /// A text of one owner whose content and length are not yet set.
 char* HkString::newBlock(std::size_t capacity) {

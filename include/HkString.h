@@ -104,15 +104,16 @@ private:
         std::uint32_t unused;
         std::uint32_t length;
     };
-    /// The text of every string that is empty from its start: never counted, written or released.
+    /// The text of every string that is empty from its start: never counted, written or released. It is as long as
+    /// the pieces that comparisons load, of which compilers would otherwise warn although no empty text is compared so.
     struct EmptyText {
         Head head;
-        char terminator;
+        char text[16];
     };
 
     static EmptyText s_empty;
 
-    static char* emptyText() noexcept { return &s_empty.terminator; }
+    static char* emptyText() noexcept { return s_empty.text; }
     static Head& headOf(char* text) noexcept { return reinterpret_cast<Head*>(text)[-1]; }
 
     static void setLength(char* text, std::size_t length) noexcept {
