@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <random>
@@ -15,7 +16,9 @@ public:
     TemporaryDirectory() {
         std::random_device random;
         do {
-            m_path = testing::TempDir() + "tessal-" + std::to_string(random());
+            // With "/" on every host, as messages show paths.
+            m_path =
+                std::filesystem::u8path(testing::TempDir()).generic_u8string() + "tessal-" + std::to_string(random());
         } while (!HkFile::mkdir(m_path.c_str(), false) && HkFile::exist(m_path.c_str()));
     }
     ~TemporaryDirectory() { HkFile::rmtree(m_path.c_str()); }

@@ -16,14 +16,14 @@ TEST(TessalSmokeMgr, WritesWhatIsFormattedAndNothingElse) {
     const std::string path = directory.write("status", "former content");
     {
         TessalSmokeMgr status(path.c_str());
-        EXPECT_TRUE(status.smokeStatus("%d\n", 5));
+        EXPECT_TRUE(status.smokeStatus("%d ", 5));
         EXPECT_FALSE(status.smokeStatus("%s", ""));
         EXPECT_TRUE(status.open("other") && status.close());
         EXPECT_TRUE(status.smokeStatus("%s", "100% %s"));
         const char* const noFormat = nullptr;
         EXPECT_FALSE(status.smokeStatus(noFormat));
     }
-    EXPECT_EQ(directory.read("status"), "5\n100% %s");
+    EXPECT_EQ(directory.read("status"), "5 100% %s");
     { const TessalSmokeMgr truncating(path.c_str()); }
     EXPECT_EQ(directory.read("status"), "");
 }
