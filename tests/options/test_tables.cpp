@@ -1,115 +1,176 @@
-// The two option tables: their rows, ranges and clears.
+// The two option tables: the rows that each operation reads and resets, and its arguments, which go through the parser
+// of their command and come back as the same options.
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <iterator>
+#include <memory>
+#include <random>
+#include <string>
 #include <vector>
 
-#include "DeviceOptionsMgr.h"
-#include "ModeOptionsMgr.h"
+#include "DataPath.h"
+#include "examples/batch/OptionReader.h"
 
 namespace {
 
 using namespace tESSALNS;
 
 template <class Manager>
-struct Range {
-    std::vector<HkString> (Manager::*read)() const;
-    void (Manager::*clear)();  ///< null where the operation has none
+struct Operation {
+    const char* command;
     int first;
     int last;
+    std::vector<HkString> (Manager::*options)() const;
+    void (Manager::*clear)();  ///< null where the operation has none
 };
 
-const Range<DeviceOptionsMgr> deviceRanges[] = {
-    {&DeviceOptionsMgr::getProgramOptions, &DeviceOptionsMgr::clearProgramOptions, 0, 67},
-    {&DeviceOptionsMgr::getEraseOptions, &DeviceOptionsMgr::clearEraseOptions, 67, 81},
-    {&DeviceOptionsMgr::getReadbackOptions, &DeviceOptionsMgr::clearReadbackOptions, 81, 83},
-    {&DeviceOptionsMgr::getVerifyOptions, nullptr, 84, 92},
-    {&DeviceOptionsMgr::getCustCodeOptions, nullptr, 94, 102},
-};
-const Range<ModeOptionsMgr> modeRanges[] = {
-    {&ModeOptionsMgr::getCFGenerateOptions, &ModeOptionsMgr::clearCFGenerateOptions, 0, 3},
-    {&ModeOptionsMgr::getMPMGenerateOptions, &ModeOptionsMgr::clearMPMGenerateOptions, 4, 8},
-    {&ModeOptionsMgr::getPFFGenerateOptions, &ModeOptionsMgr::clearPFFGenerateOptions, 9, 18},
-};
+const std::vector<Operation<DeviceOptionsMgr>> deviceOperations = {
+    {"program", 0, 67, &DeviceOptionsMgr::getProgramOptions, &DeviceOptionsMgr::clearProgramOptions},
+    {"erase", 67, 81, &DeviceOptionsMgr::getEraseOptions, &DeviceOptionsMgr::clearEraseOptions},
+    {"readback", 81, 83, &DeviceOptionsMgr::getReadbackOptions, &DeviceOptionsMgr::clearReadbackOptions},
+    {"verify", 84, 92, &DeviceOptionsMgr::getVerifyOptions, nullptr},
+    {"custcode", 94, 102, &DeviceOptionsMgr::getCustCodeOptions, nullptr}};
+const std::vector<Operation<ModeOptionsMgr>> modeOperations = {
+    {"generate", 0, 3, &ModeOptionsMgr::getCFGenerateOptions, &ModeOptionsMgr::clearCFGenerateOptions},
+    {"generate", 4, 8, &ModeOptionsMgr::getMPMGenerateOptions, &ModeOptionsMgr::clearMPMGenerateOptions},
+    {"generate", 9, 18, &ModeOptionsMgr::getPFFGenerateOptions, &ModeOptionsMgr::clearPFFGenerateOptions}};
 
-/// Turns a row on, a switch by true and a text option by a text; the other way is refused.
+std::string shown(const std::vector<HkString>& texts) {
+    std::string result;
+    for (const HkString& text : texts) {
+        result += '[' + std::string(text) + ']';
+    }
+    return result;
+}
+
+/// The checks of one operation on the rows of its table.
 template <class Manager, class Option>
-void turnOn(Manager& manager, Option option) {
-    EXPECT_NE(manager.setOption(option, true), manager.setOption(option, "T")) << int{option};
-}
+class Table {
+public:
+    Table(const Operation<Manager>& operation, const OptionRow* rows) : m_operation(operation), m_rows(rows) {}
 
-/// Resets by @p clear, after which exactly the rows of the range are off and what is no option stays.
-template <class Option, class Manager>
-void expectClears(void (Manager::*clear)(), int first, int last) {
-    Manager manager;
-    const int rows = manager.getNumberOptions();
-    for (int row = 0; row < rows; ++row) {
-        turnOn(manager, Option(row));
-    }
-    manager.setEnable(Option(1), false);
-    manager.setOptionsModified(true);
-    (manager.*clear)();
-    for (int row = 0; row < rows; ++row) {
-        const bool isOn = manager.getOption(row) || !manager.getOptionString(row).IsEmpty();
-        EXPECT_EQ(isOn, row < first || row >= last) << row;
-    }
-    EXPECT_TRUE(!manager.isEnabled(Option(1)) && manager.getOptionsModified());
-}
-
-template <class Option, class Manager, std::size_t rangeCount, std::size_t rowCount>
-void expectRanges(const Range<Manager> (&ranges)[rangeCount], const OptionRow (&rows)[rowCount]) {
-    const int count = static_cast<int>(rowCount);
-    for (const auto& [read, clear, first, last] : ranges) {
-        SCOPED_TRACE(first);
-        int membersLeft = 0;
-        for (int row = 0; row < count; ++row) {
-            const bool isMember = membersLeft > 0;
-            membersLeft = isMember ? membersLeft - 1 : rows[row].groupSize;
+    /// Every row, which alone shows only inside the range and when it is no member of a group, with the leader of its
+    /// group, and random choices, from all rows to few.
+    void expectRoundTrips() {
+        int leader = 0;
+        for (int row = 0; row < m_count; ++row) {
+            leader = row <= leader + m_rows[leader].groupSize ? leader : row;
             Manager manager;
-            turnOn(manager, Option(row));
-            EXPECT_EQ((manager.*read)().empty(), isMember || row < first || row >= last) << rows[row].key;
+            give(manager, row);
+            EXPECT_EQ((manager.*m_operation.options)().empty(), row != leader || !isInside(row)) << m_rows[row].key;
+            give(manager, leader);
+            expectRoundTrip(manager);
         }
-        if (clear != nullptr) {
-            expectClears<Option>(clear, first, last);
+        for (unsigned int round = 0; round < 40; ++round) {
+            expectRoundTrip(randomChoice(1 + round % 8));
         }
     }
-    expectClears<Option, Manager>(&Manager::clearAllOptions, 0, count);
+
+    /// Exactly the rows of the range are reset, and what is no option stays.
+    void expectClear() {
+        Manager manager;
+        for (int row = 0; row < m_count; ++row) {
+            give(manager, row);
+        }
+        manager.setEnable(Option(1), false);
+        manager.setOptionsModified(true);
+        (manager.*m_operation.clear)();
+        for (int row = 0; row < m_count; ++row) {
+            const bool isOn = manager.getOption(row) || !manager.getOptionString(row).IsEmpty();
+            EXPECT_NE(isOn, isInside(row)) << m_rows[row].key;
+        }
+        EXPECT_TRUE(!manager.isEnabled(Option(1)) && manager.getOptionsModified());
+    }
+
+private:
+    bool isInside(int row) const { return row >= m_operation.first && row < m_operation.last; }
+
+    void expectRoundTrip(const Manager& manager) const {
+        const std::vector<HkString> options = (manager.*m_operation.options)();
+        SCOPED_TRACE(m_operation.command + shown(options));
+        std::unique_ptr<HkCmdArgs> args;
+        ASSERT_NO_THROW(args = parsed(options));
+        Manager back;
+        OptionReader<Manager, Option>(*args, m_rows, back).read(m_operation.first, m_operation.last);
+        EXPECT_EQ(shown((back.*m_operation.options)()), shown(options));
+    }
+
+    /// The options as the command's parser, strict, gives them back.
+    std::unique_ptr<HkCmdArgs> parsed(const std::vector<HkString>& options) const {
+        CommandSet line;
+        line.addCommand(m_operation.command);
+        for (const HkString& option : options) {
+            line.addCommand(option);
+        }
+        if constexpr (std::is_same_v<Manager, DeviceOptionsMgr>) {
+            line.addCommand("-p");
+            line.addCommand(1);
+        }
+        return std::unique_ptr<HkCmdArgs>(
+            TessalCmdargs::getCmdargs(line.getNumberCommands(), line.getCommands(), true));
+    }
+
+    /// Turns a row on, a switch by true and a text option by a text; the other way is refused.
+    void give(Manager& manager, int row) const {
+        const bool isFormat = std::string(m_rows[row].dashValue) == "-format";
+        EXPECT_EQ(manager.setOption(Option(row), true), m_rows[row].isSwitch()) << m_rows[row].key;
+        EXPECT_NE(manager.setOption(Option(row), isFormat ? "hex" : "1"), m_rows[row].isSwitch()) << m_rows[row].key;
+    }
+
+    /// Arguments do not tell whose an empty one or a revision's bare switch is, so a revision's switch and digit are
+    /// given together.
+    Manager randomChoice(unsigned int share) {
+        Manager some;
+        for (int row = m_operation.first; row < m_operation.last; ++row) {
+            const std::string dashValue = m_rows[row].dashValue;
+            const bool isDigit = dashValue.size() == 1 && dashValue[0] <= '3';
+            if (!dashValue.empty() && !isDigit && m_random() % share == 0) {
+                give(some, row);
+                give(some, dashValue == "-ver" ? row + 1 : row);
+            }
+        }
+        return some;
+    }
+
+    const Operation<Manager>& m_operation;
+    const OptionRow* m_rows;
+    const int m_count = Manager().getNumberOptions();
+    std::mt19937 m_random{20261124};
+};
+
+template <class Option, class Manager>
+void expectTable(const std::vector<Operation<Manager>>& operations, const OptionRow* rows) {
+    for (const Operation<Manager>& operation : operations) {
+        SCOPED_TRACE(operation.first);
+        Table<Manager, Option> table(operation, rows);
+        table.expectRoundTrips();
+        operation.clear != nullptr ? table.expectClear() : void();
+    }
+    const Operation<Manager> all{"", 0, Manager().getNumberOptions(), nullptr, &Manager::clearAllOptions};
+    Table<Manager, Option>(all, rows).expectClear();
 }
 
-TEST(OptionTables, ReadersAndClearsReachTheirRangeAlone) {
-    expectRanges<PROGRAM_OPTION>(deviceRanges, programOptionRows);
-    expectRanges<MODE_OPTION>(modeRanges, modeOptionRows);
+TEST(OptionTables, EveryRowComesBackThroughItsCommandAndIsReset) {
+    DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
+    expectTable<PROGRAM_OPTION>(deviceOperations, programOptionRows);
+    expectTable<MODE_OPTION>(modeOperations, modeOptionRows);
 }
 
 TEST(OptionTables, RowNumbersAndLayoutArePartOfTheInterface) {
-    const int numbers[] = {USERCODE,
-                           CMGR_PROGRAM_MAX_OPTION,
-                           REV0_CHECKED,
-                           REV3_CUSTCODE,
-                           PROGRAM_MAX_OPTIONS,
-                           ERASE_MAX_OPTIONS,
-                           VERIFY_REV0,
-                           VERIFY_ALL,
-                           CUSTCODE_REV0,
-                           LOAD_REV};
-    const int expected[] = {9, 24, 25, 56, 67, 81, 84, 92, 94, 104};
-    EXPECT_TRUE(std::equal(std::begin(numbers), std::end(numbers), std::begin(expected)));
+    static_assert(USERCODE == 9 && CMGR_PROGRAM_MAX_OPTION == 24 && REV0_CHECKED == 25 && REV3_CUSTCODE == 56);
+    static_assert(PROGRAM_MAX_OPTIONS == 67 && ERASE_MAX_OPTIONS == 81 && VERIFY_REV0 == 84 && VERIFY_ALL == 92);
+    static_assert(CUSTCODE_REV0 == 94 && LOAD_REV == 104);
     constexpr std::size_t list = sizeof(std::vector<int>);
     static_assert(sizeof(PROGRAM_OPTION) == 4 && sizeof(MODE_OPTION) == 4);
     static_assert(sizeof(DeviceOptionsMgr) == sizeof(void*) + list + 8 + 2 * list + 8);
     static_assert(sizeof(ModeOptionsMgr) == sizeof(void*) + list + 2 * list + 8);
-    DeviceOptionsMgr device;
-    int switches = 0;
-    for (int row = 0; row < device.getNumberOptions(); ++row) {
-        switches += device.isOptionBool(row) ? 1 : 0;
-    }
-    EXPECT_EQ(switches, 92);
-    EXPECT_STREQ(device.getNumberOfOptionsText(), "NumberOfDeviceOptions");
-    EXPECT_STREQ(device.getAttribute(PROGRAM_MAX_OPTIONS), "PROGRAM_OPTIONS/PROGRAM_MAX_OPTIONS");
-    ModeOptionsMgr mode;
-    EXPECT_STREQ(mode.getNumberOfOptionsText(), "NumberOfModeOptions");
-    EXPECT_STREQ(mode.getAttribute(IDCODE_LOOP_COUNT), "MODE_OPTIONS/IDCODE_LOOP_COUNT");
+    EXPECT_EQ(std::count_if(std::begin(programOptionRows), std::end(programOptionRows),
+                            [](const OptionRow& row) { return row.isSwitch(); }),
+              92);
+    EXPECT_STREQ(DeviceOptionsMgr().getAttribute(PROGRAM_MAX_OPTIONS), "PROGRAM_OPTIONS/PROGRAM_MAX_OPTIONS");
+    EXPECT_STREQ(ModeOptionsMgr().getAttribute(IDCODE_LOOP_COUNT), "MODE_OPTIONS/IDCODE_LOOP_COUNT");
 }
 
 TEST(OptionTables, RowsOutsideAreRefused) {
@@ -121,9 +182,7 @@ TEST(OptionTables, RowsOutsideAreRefused) {
         EXPECT_TRUE(manager.getAttribute(option).IsEmpty());
     }
     EXPECT_TRUE(manager.setOption(USERCODE, static_cast<const char*>(nullptr)));
-    manager.setUESSize(7);
     manager.init_attributes();
-    EXPECT_TRUE(manager.getNumberOptions() == 210 && manager.getUESSize() == 0);
     EXPECT_FALSE(manager.setOption(PROGRAM_OPTION(105), true)) << "a description without a value row";
 }
 
