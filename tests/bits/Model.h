@@ -104,10 +104,6 @@ struct Model {
         return *this;
     }
     void operator=(bool value) { std::fill(bytes.begin(), bytes.end(), static_cast<unsigned char>(value ? 0xFF : 0)); }
-    void operator+=(const Model& other) { concatenate(other); }
-    void operator+=(const char* text) { addHex(text); }
-    void operator>>(std::size_t n) { rightShift(n); }
-    void operator<<(std::size_t n) { leftShift(n); }
     void operator!() {
         combine(*this, [](int own, int) { return ~own; });
     }

@@ -124,24 +124,22 @@ private:
                 call(mine, theirs);
             };
         };
-        operation = chance.below(mirrors ? 23 : 19);
+        operation = chance.below(mirrors ? 19 : 15);
         if (operation < 3 && theirs.length < mine.length) {
             return;  // the right side of a combination must be long enough
         }
         choose(
             operation, both([&](auto& v, auto& w) { v &= w; }), both([&](auto& v, auto& w) { v ^= w; }),
             both([&](auto& v, auto& w) { v |= w; }), both([&](auto& v, auto&) { v.addBit(value); }),
-            both([&](auto& v, auto&) { v.setCapacity(more); }), both([&](auto& v, auto& w) { base(v) += w; }),
-            both([&](auto& v, auto& w) { v.concatenate(w); }), both([&](auto& v, auto&) { base(v) += text.c_str(); }),
+            both([&](auto& v, auto&) { v.setCapacity(more); }), both([&](auto& v, auto& w) { v.concatenate(w); }),
             both([&](auto& v, auto&) { v.addHex(text.c_str()); }),
             both([&](auto& v, auto&) { v.setSize(inside, value); }), both([&](auto& v, auto&) { v.resize(any); }),
-            both([&](auto& v, auto&) { base(v) >> shift; }), both([&](auto& v, auto&) { v.rightShift(shift); }),
-            both([&](auto& v, auto&) { base(v) << shift; }), both([&](auto& v, auto&) { v.leftShift(shift); }),
+            both([&](auto& v, auto&) { v.rightShift(shift); }), both([&](auto& v, auto&) { v.leftShift(shift); }),
             both([&](auto& v, auto& w) { base(v) = w; }),
             both([&](auto& v, auto&) { value ? void(base(v) = shift % 2 != 0) : void(!base(v)); }),
             [&] { access(a, mine); }, [&] { read(a, mine, b, theirs); }, [&] { join(a, mine, b, theirs); });
         if constexpr (mirrors) {
-            operation > 19 ? updateField(a, mine, b, theirs) : void();
+            operation > 15 ? updateField(a, mine, b, theirs) : void();
         }
     }
 
@@ -194,32 +192,27 @@ private:
         const std::size_t room = mine.numbering == Numbering::Usual ? mine.capacity : mine.length;
         const std::size_t start = chance.size(room);
         const bool flag = chance.coin();
-        std::vector<bool> bits;
-        if (operation == 20) {
-            if (theirs.length > room - start) {
-                return;
-            }
-            for (std::size_t i = theirs.length; i-- > 0;) {
-                bits.push_back(theirs.read(i));
-            }
-            a.updateBitField(&b, static_cast<int>(start), flag);
-        } else if (operation == 21) {
-            const std::size_t count = chance.size(std::min<std::size_t>(room - start, 32));
-            const auto value = static_cast<unsigned>(chance.below(0x100000000));
-            for (std::size_t k = 0; k < count; ++k) {
-                bits.push_back((value >> (flag ? count - 1 - k : k) & 1) != 0);
-            }
-            a.updateBitField(value, static_cast<int>(start), static_cast<int>(count), flag);
-        } else {
-            const std::size_t size = chance.size((room - start) / 8);
-            std::string bytes;
-            for (std::size_t k = 0; k < 8 * size; ++k) {
-                bytes += k % 8 == 0 ? std::string(1, static_cast<char>(chance.below(256))) : "";
-                bits.push_back((bytes.back() >> (flag ? k % 8 : 7 - k % 8) & 1) != 0);
-            }
-            const std::size_t spared = size > 0 ? chance.below(8) : 0;
-            a.updateBitField(bytes.data(), static_cast<int>(start), static_cast<int>(8 * size - spared), flag);
+        const auto value = static_cast<unsigned>(chance.below(0x100000000));
+        const std::size_t count = operation == 16   ? theirs.length
+                                  : operation == 17 ? chance.size(std::min<std::size_t>(room - start, 32))
+                                                    : chance.size((room - start) / 8) * 8;
+        if (count > room - start) {
+            return;
         }
+        std::string bytes(count / 8, '\0');
+        std::generate(bytes.begin(), bytes.end(), [this] { return static_cast<char>(chance.below(256)); });
+        std::vector<bool> bits;
+        for (std::size_t k = 0; k < count; ++k) {
+            bits.push_back(operation == 16   ? theirs.read(count - 1 - k)
+                           : operation == 17 ? (value >> (flag ? count - 1 - k : k) & 1) != 0
+                                             : (bytes[k / 8] >> (flag ? k % 8 : 7 - k % 8) & 1) != 0);
+        }
+        const int first = static_cast<int>(start);
+        const std::size_t spared = count > 0 ? chance.below(8) : 0;
+        choose(
+            operation - 16, [&] { a.updateBitField(&b, first, flag); },
+            [&] { a.updateBitField(value, first, static_cast<int>(count), flag); },
+            [&] { a.updateBitField(bytes.data(), first, static_cast<int>(count - spared), flag); });
         mine.field(start, bits);
     }
 

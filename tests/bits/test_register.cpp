@@ -61,12 +61,9 @@ TEST(Register, JoinsItsPartsAndSplitsTheTotalOnlyWhenToldThatItChanged) {
 }
 
 TEST(Register, ReadsTheLow31BitsOfTheStatusWithSign) {
-    const std::tuple<int, unsigned int, int> cases[]{{0, 5, 0},
-                                                     {3, 5, 5},
-                                                     {31, 0x40000000, -0x40000000},
-                                                     {32, 0x80000001, 1},
-                                                     {32, 0xFFFFFFFF, -1},
-                                                     {40, 0x12345678, 0x12345678}};
+    const std::tuple<int, unsigned, int> cases[]{{0, 5, 0},           {31, 0x40000000, -0x40000000},
+                                                 {32, 0x80000001, 1}, {32, 0xFFFFFFFF, -1},
+                                                 {40, 5, 5},          {40, 0x12345678, 0x12345678}};
     for (const auto& [size, status, read] : cases) {
         Register reg(4, 4, size);
         reg.setStatus(status);

@@ -103,6 +103,8 @@ TEST(RLBitVec, AppendsBehindItsRightEndAndShiftsByItsOwnOperators) {
     EXPECT_EQ(storage(vector), "0011010");
     vector >> 3;
     EXPECT_EQ(storage(vector), "1010000");
+    EXPECT_EQ(storage(static_cast<LRBitVec&>(vector) >> 2), "0010100");
+    EXPECT_EQ(storage(static_cast<LRBitVec&>(vector) << 2), "1010000");
     EXPECT_EQ(storage(!static_cast<const RLBitVec&>(vector)), "0101111");
     EXPECT_EQ(storage(vector & from<RLBitVec>("1100000")), "1000000");
     vector = true;
