@@ -35,33 +35,36 @@ TEST_P(Hex2BitTest, LoadsOfTextsThatFitInNoOrderlyWay) {
     }
 }
 
+TEST_P(Hex2BitTest, NewVectors) {
+    const std::pair<std::unique_ptr<RLBitVec>, const char*> cases[] = {
+        {Hex2Bit::convertHexString2BitVec("1", 16, false, false, true), "0000000000000001"},
+        {Hex2Bit::convertHexString2BitVec("1", 16, false, false, false), "0001000000000000"},
+        {Hex2Bit::convertHexString2BitVec("123", 14, false, false, true), "00010010001100"},
+        {Hex2Bit::convertBinString2BitVec("101", 6, false), "101000"},
+        {Hex2Bit::convertBinString2BitVec("101", 6, true), "000101"},
+        {Hex2Bit::convertBinString2BitVec("0x1y0", 4, false), "0111"},
+        {Hex2Bit::convertString2BitVec("\x0A\0\x7F", 3, false, false), "1010000001111111"},
+        {Hex2Bit::convertString2BitVec("\x81", 1, false, false), "11111111111111111111111110000001"},
+        {Hex2Bit::convertString2BitVec("AB", -1, false, false), ""},
+        {Hex2Bit::convertHexString2BitVec(nullptr, -8, false, false, true), ""}};
+    for (const auto& [vector, bits] : cases) {
+        EXPECT_EQ(bitsOf(*vector), bits);
+    }
+    EXPECT_NE(Hex2Bit::convertBinString2BinData(nullptr, -8, false), nullptr);
+}
+
 TEST_P(Hex2BitTest, FillValueAndInitialise) {
     Hex2Bit::setInitValue(true);
     HexModel::NumberedVec vector(12, Numbering::Mirrored);
     Hex2Bit::convertHexString2BitVec(&vector, "0", 4, false, false, true);
     EXPECT_EQ(bitsOf(vector), "000011111111");
     EXPECT_EQ(vector.data()[1], 0xF0) << "the usual numbering is back, and the slack is filled";
-
     EXPECT_EQ(bitsOf(*Hex2Bit::convertHexString2BitVec("0", 12, true, false, false)), "111111110000");
     const auto bytes = Hex2Bit::convertBinString2BinData("000", 12, false);
-    EXPECT_EQ(bytes[0], 0xFF);
-    EXPECT_EQ(bytes[2], 0xFF) << "an array of (12 + 14) / 8 bytes";
+    EXPECT_EQ(bytes[0] & bytes[2], 0xFF) << "an array of (12 + 14) / 8 bytes";
 }
 
-TEST_P(Hex2BitTest, LeftFillAddsWholeDigits) {
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertHexString2BitVec("1", 16, false, false, true)), "0000000000000001");
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertHexString2BitVec("1", 16, false, false, false)), "0001000000000000");
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertHexString2BitVec("123", 14, false, false, true)), "00010010001100");
-}
-
-TEST_P(Hex2BitTest, BinaryAndPlainText) {
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertBinString2BitVec("101", 6, false)), "101000");
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertBinString2BitVec("101", 6, true)), "000101");
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertBinString2BitVec("0x1y0", 4, false)), "0111");
-
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertString2BitVec("\x0A\0\x7F", 3, false, false)), "1010000001111111");
-    EXPECT_EQ(bitsOf(*Hex2Bit::convertString2BitVec("\x81", 1, false, false)), "11111111111111111111111110000001");
-    EXPECT_EQ(Hex2Bit::convertString2BitVec("AB", -1, false, false)->length(), 0U);
+TEST_P(Hex2BitTest, PlainTextIntoHeldVectors) {
     RLBitVec vector(20);
     Hex2Bit::convertString2BitVec(&vector, "AB", 2, true, false);
     EXPECT_EQ(bitsOf(vector), "01000010100000100000") << "loaded like any text of 16 bits";
@@ -81,8 +84,6 @@ TEST_P(Hex2BitTest, NullTextsAndVectorsLeaveEverythingAlone) {
     Hex2Bit::convertHexString2BitVec(nullptr, "12", 8, false, false, true);
     Hex2Bit::convertBinString2BitVec(nullptr, "1", 8, false);
     Hex2Bit::convertString2BitVec(nullptr, "AB", 2, false, false);
-    EXPECT_EQ(Hex2Bit::convertHexString2BitVec(nullptr, -8, false, false, true)->length(), 0U);
-    EXPECT_NE(Hex2Bit::convertBinString2BinData(nullptr, -8, false), nullptr);
 }
 
 #ifdef NDEBUG
@@ -100,29 +101,14 @@ TEST_P(Hex2BitTest, IndexesBeyondTheVectorArePassedOver) {
 }
 #endif
 
-TEST_P(Hex2BitTest, EveryCharacterIsJudgedInEachPartOfALongText) {
-    RLBitVec vector(4 * 140);
-    for (const std::size_t place : {0U, 1U, 31U, 32U, 63U, 64U, 127U, 128U, 138U, 139U}) {
-        std::string text(140, '7');
-        for (int character = 0; character < 256; ++character) {
-            text[place] = static_cast<char>(character);
-            const bool byteSwap = coin();
-            Model model = HexModel::modelOf(vector);
-            Hex2Bit::convertHexString2BitVec(&vector, std::string_view(text), 560, place % 2 != 0, byteSwap, false);
-            HexModel::loadHex(model, text, 560, place % 2 != 0, byteSwap);
-            ASSERT_EQ(HexModel::arrayOf(vector), model.bytes) << character << " at " << place;
-        }
-    }
-}
-
 /// Random loads against the model: all orders, fill values and numberings, foreign characters, cuts, spare length.
 class Hex2BitLoads : public Hex2BitTest {
 protected:
     std::string text(std::size_t length, std::string_view alphabet, std::size_t foreignPercent) {
-        std::string result;
-        for (std::size_t i = 0; i < length; ++i) {
-            result +=
-                below(100) < foreignPercent ? static_cast<char>(1 + below(255)) : alphabet[below(alphabet.size())];
+        std::string result(length, ' ');
+        for (char& character : result) {
+            const bool isForeign = below(100) < foreignPercent;
+            character = isForeign ? static_cast<char>(1 + below(255)) : alphabet[below(alphabet.size())];
         }
         return result;
     }
@@ -150,10 +136,7 @@ protected:
 
 TEST_P(Hex2BitLoads, AgreeWithTheModel) {
     for (std::size_t round = 0; round < 151 * 60 && !HasFatalFailure(); ++round) {
-        compareOnce(round % 151, below(140));
-    }
-    for (int round = 0; round < 60 && !HasFatalFailure(); ++round) {
-        compareOnce(below(30000), below(9000));
+        round % 151 == 0 ? compareOnce(below(30000), below(9000)) : compareOnce(round % 151, below(140));
     }
 }
 
