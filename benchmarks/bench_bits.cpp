@@ -194,7 +194,7 @@ template <class Vector>
 void appendBits(State& state) {
     agree(state, "append_bits", bytesOf(appendAll<Vector>()));
     measure(state, [] { benchmark::DoNotOptimize(appendAll<Vector>()); });
-    state.SetItemsProcessed(static_cast<std::int64_t>(state.iterations() * smallBits));
+    state.SetItemsProcessed(state.iterations() * static_cast<std::int64_t>(smallBits));
 }
 
 Bytes shiftIntoWords() {
@@ -212,7 +212,7 @@ Bytes shiftIntoWords() {
 void appendLimit(State& state) {
     agree(state, "append_bits", shiftIntoWords());
     measure(state, [] { benchmark::DoNotOptimize(shiftIntoWords()); });
-    state.SetItemsProcessed(static_cast<std::int64_t>(state.iterations() * smallBits));
+    state.SetItemsProcessed(state.iterations() * static_cast<std::int64_t>(smallBits));
 }
 
 const RegisterItem appendItem{{"append_bits",
@@ -380,7 +380,7 @@ void compareEqual(State& state) {
 }
 
 void compareLimit(State& state) {
-    const Bytes a = first();
+    const Bytes a(first());  // NOLINT(performance-unnecessary-copy-initialization): two arrays are compared
     measure(state, [&] {
         benchmark::DoNotOptimize(a.data());
         benchmark::DoNotOptimize(std::memcmp(a.data(), first().data(), a.size()));
@@ -458,7 +458,7 @@ Bytes shiftedCopy(const Bytes& low, std::size_t lowBits, const Bytes& high, std:
     std::memcpy(result.data(), low.data(), (lowBits + 7) / 8);
     const unsigned shift = lowBits % 8;
     unsigned char* const target = result.data() + lowBits / 8;
-    target[0] = static_cast<unsigned char>((target[0] & ((1U << shift) - 1)) | high[0] << shift);
+    target[0] = static_cast<unsigned char>((target[0] & ((1U << shift) - 1)) | unsigned{high[0]} << shift);
     for (std::size_t i = 1; i < (highBits + 7 + shift) / 8; ++i) {
         const unsigned upper = i < high.size() ? high[i] : 0;
         target[i] = static_cast<unsigned char>(high[i - 1] >> (8 - shift) | upper << shift);

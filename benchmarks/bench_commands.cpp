@@ -73,7 +73,7 @@ void loadCommands() {
     std::filesystem::create_directories(directory);
     std::string rows;
     for (const auto& [name, format] : formats()) {
-        rows += (rows.empty() ? "" : ":") + name + ",TRUE," + format;
+        rows.append(rows.empty() ? "" : ":").append(name).append(",TRUE,").append(format);
     }
     std::ofstream(directory / "tessal.acd") << "[base]\nCOMMAND_FORMAT = " << rows << "\n";
     DeviceProfile::setDataPath(directory.string().c_str());

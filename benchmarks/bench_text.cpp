@@ -74,7 +74,7 @@ void append(benchmark::State& state, Piece piece, std::size_t pieceLength) {
     if (length != pieces * pieceLength) {
         state.SkipWithError("pieces are missing");
     }
-    state.SetItemsProcessed(static_cast<std::int64_t>(state.iterations() * pieces));
+    state.SetItemsProcessed(state.iterations() * static_cast<std::int64_t>(pieces));
 }
 
 template <class Text>

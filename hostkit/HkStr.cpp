@@ -4,6 +4,8 @@
 #include <cstdio>
 #include <cstring>
 #include <limits>
+#include <string>
+#include <string_view>
 
 namespace HostKit {
 namespace {
@@ -14,6 +16,23 @@ const char* orEmpty(const char* text) {
 
 unsigned char folded(char ch) {
     return static_cast<unsigned char>(HkStr::ToLower(ch));
+}
+
+/// The format without the single `l` of its numbers, which have 32 bits here on every host. `ll` stays.
+std::string withoutLong(const char* format) {
+    constexpr std::string_view numbers = "diouxX";
+    std::string result;
+    bool isConversion = false;
+    for (; *format != '\0'; ++format) {
+        const bool isEnd = HkStr::ToLower(*format) >= 'a' && HkStr::ToLower(*format) <= 'z' && *format != 'l';
+        const bool isSingle =
+            isConversion && *format == 'l' && result.back() != 'l' && numbers.find(format[1]) != std::string_view::npos;
+        if (!isSingle) {
+            result += *format;
+        }
+        isConversion = *format == '%' ? !isConversion : isConversion && !isEnd;
+    }
+    return result;
 }
 
 bool isBlank(char ch) {
@@ -149,7 +168,7 @@ int HkStr::SPrintf(char* dest, const char* format, ...) {
     }
     std::va_list arguments;
     va_start(arguments, format);
-    const int written = std::vsprintf(dest, format, arguments);
+    const int written = std::vsprintf(dest, withoutLong(format).c_str(), arguments);
     va_end(arguments);
     return written;
 }

@@ -50,8 +50,8 @@ public:
     static int IsDigit(int ch);
     /// Non-zero for 0 to 127.
     static int IsAscii(int ch);
-    /// printf into @p dest; gives the number of characters written. The compiler does not check the arguments, since
-    /// callers pass 32-bit numbers for `%lx`.
+    /// printf into @p dest; gives the number of characters written. A number with a single `l` has 32 bits, on every
+    /// host, so the compiler does not check the arguments.
     static int SPrintf(char* dest, const char* format, ...);
 
     /// True when the first @p n bytes of both are the same; bytes, not letters, and no null. A short text costs no

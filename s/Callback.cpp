@@ -10,9 +10,12 @@ namespace {
 
 constexpr int longSilence = 11000;  // milliseconds: more than 10 whole seconds
 
+using Clock = std::chrono::steady_clock;
+
+/// When the library was loaded, and a little earlier, so that no tick is 0: that stands for a silence not yet begun.
+const Clock::time_point start = Clock::now() - std::chrono::milliseconds(1);
+
 int realTicks() {
-    using Clock = std::chrono::steady_clock;
-    static const Clock::time_point start = Clock::now();
     const auto passed = std::chrono::duration_cast<std::chrono::milliseconds>(Clock::now() - start);
     return static_cast<int>(static_cast<unsigned int>(passed.count()));
 }

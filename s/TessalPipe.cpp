@@ -21,6 +21,14 @@ void* asHandle(platform::Pipe pipe) {
     return reinterpret_cast<void*>(pipe);  // NOLINT(performance-no-int-to-ptr): a handle is a number behind a pointer
 }
 
+/// Puts a pipe in the place of a former one, which is closed.
+void replace(void*& handle, platform::Pipe pipe) {
+    if (asPipe(handle) != platform::noPipe) {
+        platform::pipeHost().close(asPipe(handle));
+    }
+    handle = asHandle(pipe);
+}
+
 /// The part of a handle that messages show.
 unsigned int shown(void* handle) {
     return static_cast<unsigned int>(asPipe(handle));
@@ -62,19 +70,16 @@ bool TessalPipe::initializeSocketInServer() {
     if (platform::pipeHost().exists(m_pipeName)) {
         return true;
     }
-    const platform::Pipe pipe = platform::pipeHost().create(m_pipeName);
-    if (pipe == platform::noPipe) {
+    replace(m_handle, platform::pipeHost().create(m_pipeName));
+    if (asPipe(m_handle) == platform::noPipe) {
         return false;
     }
-    m_handle = asHandle(pipe);
     HkMessageManager::debugStub(" Server pipe %s created. fd=0x%X.\n", m_pipeName, shown(m_handle));
     return true;
 }
 
 bool TessalPipe::initializeSocketInClient() {
-    if (asPipe(m_handle) != platform::noPipe) {
-        platform::pipeHost().close(asPipe(m_handle));
-    }
+    replace(m_handle, platform::noPipe);
     m_handle = asHandle(platform::pipeHost().open(m_pipeName));
     if (asPipe(m_handle) == platform::noPipe) {
         HkMessageManager::debugStub(" Create pipe failed, status = %d.\n", getLastError());

@@ -30,6 +30,13 @@ TEST(HkStr, TakesNullAsTheEmptyTextAndKeepsToTheCount) {
     EXPECT_TRUE(HkStr::ICompare(none, "elf") != 0 && HkStr::ICompare("elf", none) != 0);
 }
 
+TEST(HkStr, PrintsNumbersOf32BitsByLongFormats) {
+    char text[80];
+    const int low = -0x65432110;  // 9abcdef0
+    HkStr::SPrintf(text, "l %1lx|%-9ld|%llx|%%lx|%lc", low, -1, 0x123456789ULL, 'c');
+    EXPECT_STREQ(text, "l 9abcdef0|-1       |123456789|%lx|c");
+}
+
 TEST(HkStr, ComparesWithoutCase) {
     constexpr std::size_t all = std::string::npos;
     const std::tuple<const char*, const char*, std::size_t, int> cases[] = {

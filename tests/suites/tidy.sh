@@ -16,7 +16,7 @@ for preset in dev release fuzz; do
 done
 units=$({
     { find s hostkit exceptions deviceprofile imagetools platform examples tests -name '*.cpp' 2>/dev/null || true; } |
-        grep -vE '^(platform/windows|tests/fuzz|tests/wine|tests/consumer)/' | sed 's|^|build/dev |'
+        grep -vE '/windows/|^tests/(fuzz|wine|consumer)/' | sed 's|^|build/dev |'
     find benchmarks -name '*.cpp' | sed 's|^|build/release |'
     find tests/fuzz -name '*.cpp' | sed 's|^|build/fuzz |'
 } | sort)
