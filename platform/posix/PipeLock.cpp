@@ -63,8 +63,8 @@ flock wholeFile(short type) {
 bool isSameFile(const Descriptor& file, const std::string& path) {
     struct stat opened {};
     struct stat named {};
-    return ::fstat(file.get(), &opened) == 0 && ::lstat(path.c_str(), &named) == 0 &&
-           opened.st_ino == named.st_ino && opened.st_dev == named.st_dev;
+    return ::fstat(file.get(), &opened) == 0 && ::lstat(path.c_str(), &named) == 0 && opened.st_ino == named.st_ino &&
+           opened.st_dev == named.st_dev;
 }
 
 /// The locked file; a closed descriptor, with errno set, where another server holds it.

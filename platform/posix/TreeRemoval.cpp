@@ -101,8 +101,7 @@ private:
     bool ascend() {
         Descriptor parent(::openat(m_here.get(), "..", directoryOnly));
         struct stat status {};
-        if (!parent.isOpen() || ::fstat(parent.get(), &status) != 0 ||
-            !isSame(m_levels[m_levels.size() - 2], status)) {
+        if (!parent.isOpen() || ::fstat(parent.get(), &status) != 0 || !isSame(m_levels[m_levels.size() - 2], status)) {
             return false;
         }
         ::unlinkat(parent.get(), m_levels.back().name.c_str(), AT_REMOVEDIR);

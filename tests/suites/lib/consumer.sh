@@ -14,7 +14,10 @@ install_library() {
         windows) build=$work/library; configure_shared "$build" -DCMAKE_TOOLCHAIN_FILE="$root/cmake/mingw-w64.cmake" ;;
     esac
     step "library built, $1" cmake --build "$build" --parallel "$jobs" --target TessalUtility
-    quietly cmake --install "$build" --prefix "$installed"
+    local component
+    for component in library development; do  # the tools, which the preset has too, are not built here
+        quietly cmake --install "$build" --prefix "$installed" --component "$component"
+    done
     quietly diff <(cd "$root/include" && ls) <(cd "$installed/include/TessalUtility" && ls)
 }
 
