@@ -14,19 +14,26 @@ bool isTextFormat(const std::string& path) {
                        [=](const char* text) { return HkStr::ICompare(extension, text) == 0; });
 }
 
-std::string readBytes(const std::string& path, Bytes& bytes) {
+std::string findSize(const std::string& path, std::uint64_t& size) {
     if (isTextFormat(path)) {
         return "is no binary file; generate -format bin writes one";
     }
     std::error_code error;
-    const std::uintmax_t size = std::filesystem::file_size(std::filesystem::u8path(path), error);
-    constexpr std::uintmax_t largest = 0x0FFFFFFF;  // bytes whose bits a row checksum can count
-    if (!error && size > largest) {
-        return "is larger than 256 MiB";
+    size = std::filesystem::file_size(std::filesystem::u8path(path), error);
+    return error ? "cannot be read" : "";
+}
+
+std::string readBytes(const std::string& path, Bytes& bytes) {
+    std::uint64_t size = 0;
+    if (std::string problem = findSize(path, size); !problem.empty()) {
+        return problem;
+    }
+    if (size > mostBytes) {
+        return tooLarge;
     }
     std::ifstream file(std::filesystem::u8path(path), std::ios::binary);
-    bytes.resize(error ? 0 : static_cast<std::size_t>(size));
-    if (error || !file.read(reinterpret_cast<char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()))) {
+    bytes.resize(static_cast<std::size_t>(size));
+    if (!file.read(reinterpret_cast<char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()))) {
         return "cannot be read";
     }
     return bytes.empty() ? "is empty" : "";

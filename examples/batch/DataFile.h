@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <fstream>
 #include <string>
 #include <vector>
@@ -10,6 +11,13 @@ using Bytes = std::vector<unsigned char>;
 
 /// True for a file whose name tells another format than raw bytes, such as "board.mcs".
 bool isTextFormat(const std::string& path);
+
+/// As many bytes of a file or PROM can be dealt with: those whose bits a row checksum can count.
+constexpr std::uint64_t mostBytes = 0x0FFFFFFF;
+constexpr char tooLarge[] = "is larger than 256 MiB";
+
+/// Finds the size of a file of raw bytes. What keeps it from being read; empty where nothing does.
+std::string findSize(const std::string& path, std::uint64_t& size);
 
 /// Reads a file of raw bytes. What keeps it from being read; empty where nothing does.
 std::string readBytes(const std::string& path, Bytes& bytes);

@@ -7,7 +7,6 @@
 #include <fstream>
 #include <optional>
 #include <string>
-#include <system_error>
 #include <vector>
 
 #include "ByteProgress.h"
@@ -20,8 +19,6 @@
 namespace {
 
 using PartList = std::vector<promPartAndSizePair>;
-
-constexpr std::uint64_t largestProm = 0x0FFFFFFF;  // bytes whose bits a row checksum can count
 
 PartList allParts() {
     PartList parts = PromUtility::GetPromList();
@@ -55,19 +52,14 @@ struct Content {
 
 /// What keeps a file from being summed; empty where nothing does.
 std::string measure(Content& content, std::optional<std::uint64_t> promSize) {
-    if (isTextFormat(content.path)) {
-        return "is no binary file; generate -format bin writes one";
-    }
-    std::error_code error;
-    content.size = std::filesystem::file_size(std::filesystem::u8path(content.path), error);
-    if (error) {
-        return "cannot be read";
+    if (std::string problem = findSize(content.path, content.size); !problem.empty()) {
+        return problem;
     }
     content.promSize = promSize.value_or(content.size);
     if (content.size > content.promSize) {
         return "holds " + std::to_string(content.size) + " bytes, the PROM " + std::to_string(content.promSize);
     }
-    return content.promSize > largestProm ? "is larger than 256 MiB" : "";
+    return content.promSize > mostBytes ? tooLarge : "";
 }
 
 int bitsOf(std::uint64_t bytes) {
