@@ -6,6 +6,8 @@
 
 #include "Streamable.h"
 
+class RecordReader;
+
 /// A text that streams as its length, a line feed, its characters and a line feed.
 ///
 /// A text with white space in it does not come back whole: reading ends at the first white space.
@@ -32,6 +34,9 @@ public:
     void writeStream(std::ostream& out) override;
 
 private:
+    friend class CableInfo;  // reads all its fields by one reader
+
+    void read(RecordReader& record);
     void assign(std::string_view text);
 
     char* m_text = nullptr;

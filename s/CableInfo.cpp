@@ -7,7 +7,7 @@
 #include "HkPath.h"
 #include "HkStr.h"
 #include "s/CableInfoOrigin.h"
-#include "s/RecordStream.h"
+#include "s/RecordReader.h"
 #include "s/RecordWriter.h"
 
 namespace {
@@ -93,10 +93,11 @@ CableInfo::CableInfo() {
 }
 
 void CableInfo::readStream(std::istream& in) {
-    m_portName.readStream(in);
-    readRecordInt(in, m_portNumber);
-    readRecordInt(in, m_portSpeed);
-    m_cableName.readStream(in);
+    RecordReader record(in);
+    m_portName.read(record);
+    record.readInt(m_portNumber);
+    record.readInt(m_portSpeed);
+    m_cableName.read(record);
 }
 
 void CableInfo::writeStream(std::ostream& out) {

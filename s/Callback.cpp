@@ -3,7 +3,7 @@
 #include <chrono>
 
 #include "s/ProgressClock.h"
-#include "s/RecordStream.h"
+#include "s/RecordReader.h"
 #include "s/RecordWriter.h"
 
 namespace {
@@ -58,9 +58,10 @@ Callback::Callback(const Callback& other)  // NOLINT(bugprone-copy-constructor-i
       m_subMode(other.m_subMode) {}
 
 void Callback::readStream(std::istream& in) {
-    readRecordInt(in, m_totalCount);
-    readRecordInt(in, m_currentCount);
-    readRecordInt(in, m_progressStatus);
+    RecordReader record(in);
+    record.readInt(m_totalCount);
+    record.readInt(m_currentCount);
+    record.readInt(m_progressStatus);
 }
 
 void Callback::writeStream(std::ostream& out) {

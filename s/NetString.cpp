@@ -1,10 +1,9 @@
 #include "NetString.h"
 
 #include <cstring>
-#include <string>
 #include <utility>
 
-#include "s/RecordStream.h"
+#include "s/RecordReader.h"
 #include "s/RecordWriter.h"
 
 // The copy's id is 0.
@@ -38,9 +37,13 @@ void NetString::assign(std::string_view text) {
 }
 
 void NetString::readStream(std::istream& in) {
-    std::string memory;
+    RecordReader record(in);
+    read(record);
+}
+
+void NetString::read(RecordReader& record) {
     std::string_view text;
-    if (readRecordText(in, memory, text)) {
+    if (record.readText(text)) {
         assign(text);
     }
 }

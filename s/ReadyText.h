@@ -8,16 +8,32 @@
 
 class ReadyText {
 public:
-    explicit ReadyText(std::streambuf& buffer)
-        : m_buffer(buffer),
-          m_begin(Members::begin(buffer)),
-          m_end(m_begin + std::min(Members::end(buffer) - m_begin, mostAtOnce)) {}
+    /// Nothing is ready where there is no buffer.
+    explicit ReadyText(std::streambuf* buffer) : m_buffer(buffer) { open(); }
+    ~ReadyText() { close(); }
+    ReadyText(const ReadyText&) = delete;
+    ReadyText& operator=(const ReadyText&) = delete;
 
-    const char* begin() const { return m_begin; }
+    const char* begin() const { return m_next; }
     const char* end() const { return m_end; }
 
-    /// Takes all before @p behind from the buffer.
-    void takeUpTo(const char* behind) const { Members::drop(m_buffer, static_cast<int>(behind - m_begin)); }
+    /// The characters before @p next are taken; the buffer hears of it when this one is closed.
+    void takeUpTo(const char* next) { m_next = next; }
+
+    /// Gives the buffer back to its own operations; nothing is ready until it is opened again.
+    void close() {
+        if (m_next != m_opened) {
+            Members::drop(*m_buffer, static_cast<int>(m_next - m_opened));
+        }
+        m_opened = m_next = m_end = nullptr;
+    }
+
+    void open() {
+        if (m_buffer != nullptr) {
+            m_opened = m_next = Members::begin(*m_buffer);
+            m_end = m_opened + std::min(Members::end(*m_buffer) - m_opened, mostAtOnce);
+        }
+    }
 
 private:
     static constexpr std::ptrdiff_t mostAtOnce = std::numeric_limits<int>::max();
@@ -29,7 +45,8 @@ private:
         static void drop(std::streambuf& buffer, int count) { (buffer.*&Members::gbump)(count); }
     };
 
-    std::streambuf& m_buffer;
-    const char* m_begin;
-    const char* m_end;
+    std::streambuf* const m_buffer;
+    const char* m_opened = nullptr;
+    const char* m_next = nullptr;
+    const char* m_end = nullptr;
 };

@@ -16,7 +16,7 @@ constexpr bool isDigit(Character c) {
     return c >= '0' && c <= '9';
 }
 
-/// As readRecordInt().
+/// As RecordReader::readInt().
 bool readInt(std::istream& in, int& value);
 
 /// Reads the characters of a text field, behind its length, which is above 0.

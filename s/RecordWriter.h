@@ -1,4 +1,4 @@
-// Writes the text stream form of records, which RecordStream.h reads.
+// Writes the text stream form of records, which RecordReader.h reads.
 #pragma once
 
 #include <array>

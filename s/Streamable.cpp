@@ -1,10 +1,10 @@
 #include "Streamable.h"
 
-#include "s/RecordStream.h"
+#include "s/RecordReader.h"
 #include "s/RecordWriter.h"
 
 void Streamable::readStream(std::istream& in) {
-    readRecordInt(in, m_id);
+    RecordReader(in).readInt(m_id);
 }
 
 void Streamable::writeStream(std::ostream& out) {
