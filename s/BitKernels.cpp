@@ -3,6 +3,7 @@
 #include <functional>
 
 #include "s/ByteTables.h"
+#include "s/ShiftedCopy.h"
 #include "s/WideVectors.h"
 
 namespace BitKernels {
@@ -64,92 +65,6 @@ void storePart(unsigned char* bytes, std::size_t count, Word word) {
 
 unsigned lowestBit(Word word) {
     return static_cast<unsigned>(__builtin_ctzll(word));
-}
-
-// ---- Shifted copies of whole target bytes. The source run begins `shift` bits, 1 to 7, into its first byte, so a
-// ---- target unit at offset i is source[i] >> shift | source[i + 1] << (8 - shift), whatever the unit's width.
-
-TESSAL_INLINE_BODY Word shiftedWord(const unsigned char* source, unsigned shift) {
-    return loadWord(source) >> shift | loadWord(source + 1) << (8 - shift);
-}
-
-TESSAL_INLINE_BODY unsigned char shiftedByte(const unsigned char* source, unsigned shift) {
-    return static_cast<unsigned char>(source[0] >> shift | source[1] << (8 - shift));
-}
-
-/// One block; all of it is read before any of it is written.
-template <class Block>
-TESSAL_INLINE_BODY void copyShiftedBlock(unsigned char* target, const unsigned char* source, unsigned shift) {
-    Block low;
-    Block high;
-    loadBlock(low, source);
-    loadBlock(high, source + 1);
-    low = low >> shift | high << (8 - shift);
-    storeBlock(target, low);
-}
-
-template <class Block>
-TESSAL_INLINE_BODY void copyUpwards(unsigned char* target, const unsigned char* source, std::size_t count,
-                                    unsigned shift) {
-    std::size_t i = 0;
-    for (; i + sizeof(Block) <= count; i += sizeof(Block)) {
-        copyShiftedBlock<Block>(target + i, source + i, shift);
-    }
-    for (; i + sizeof(Word) <= count; i += sizeof(Word)) {
-        storeWord(target + i, shiftedWord(source + i, shift));
-    }
-    for (; i < count; ++i) {
-        target[i] = shiftedByte(source + i, shift);
-    }
-}
-
-template <class Block>
-TESSAL_INLINE_BODY void copyDownwards(unsigned char* target, const unsigned char* source, std::size_t count,
-                                      unsigned shift) {
-    std::size_t i = count;
-    for (; i >= sizeof(Block); i -= sizeof(Block)) {
-        copyShiftedBlock<Block>(target + i - sizeof(Block), source + i - sizeof(Block), shift);
-    }
-    for (; i >= sizeof(Word); i -= sizeof(Word)) {
-        storeWord(target + i - sizeof(Word), shiftedWord(source + i - sizeof(Word), shift));
-    }
-    for (; i > 0; --i) {
-        target[i - 1] = shiftedByte(source + i - 1, shift);
-    }
-}
-
-template <class Block>
-TESSAL_INLINE_BODY void copyShifted(unsigned char* target, const unsigned char* source, std::size_t count,
-                                    unsigned shift, bool upwards) {
-    if (upwards) {
-        copyUpwards<Block>(target, source, count, shift);
-    } else {
-        copyDownwards<Block>(target, source, count, shift);
-    }
-}
-
-TESSAL_WIDE void copyShiftedWide(unsigned char* target, const unsigned char* source, std::size_t count, unsigned shift,
-                                 bool upwards) {
-    copyShifted<WideBlock>(target, source, count, shift, upwards);
-}
-
-/// Whole target bytes from any bit of the source, in the given direction.
-void copyWholeBytes(unsigned char* target, const unsigned char* source, std::size_t sourceFirst, std::size_t count,
-                    bool upwards) {
-    const auto shift = static_cast<unsigned>(sourceFirst & 7);
-    source += sourceFirst >> 3;
-    if (count == 0) {
-        return;
-    }
-    if (shift == 0) {
-        std::memmove(target, source, count);
-        return;
-    }
-    if (hasWideVectors()) {
-        copyShiftedWide(target, source, count, shift, upwards);
-    } else {
-        copyShifted<NarrowBlock>(target, source, count, shift, upwards);
-    }
 }
 
 // ---- Logic on whole bytes.
@@ -239,6 +154,18 @@ std::size_t skip(const unsigned char* bytes, std::size_t count, Word filler) {
     return hasWideVectors() ? skipWide(bytes, count, filler) : skipBody<NarrowBlock>(bytes, count, filler);
 }
 
+/// Whether a copy from the low end would overwrite what it has yet to read: the target begins inside the source run.
+bool beginsInside(const unsigned char* target, std::size_t targetFirst, const unsigned char* source,
+                  std::size_t sourceFirst, std::size_t count) {
+    target += targetFirst >> 3;
+    source += sourceFirst >> 3;
+    if (target == source) {
+        return (targetFirst & 7) > (sourceFirst & 7);
+    }
+    const std::size_t sourceBytes = ((sourceFirst & 7) + count + 7) >> 3;
+    return std::less<>()(source, target) && std::less<>()(target, source + sourceBytes);
+}
+
 }  // namespace
 
 Word readBits(const unsigned char* bytes, std::size_t first, std::size_t count) {
@@ -286,21 +213,15 @@ void copyBits(unsigned char* target, std::size_t targetFirst, const unsigned cha
     const auto copyTail = [&] {
         writeBits(target, 8 * run.tailByte, run.tailBits, readBits(source, tailFirst, run.tailBits));
     };
-    // Towards lower addresses the copy begins at the low end, otherwise at the high end, so that nothing is
-    // overwritten before it is read.
-    const unsigned char* const targetByte = target + (targetFirst >> 3);
-    const unsigned char* const sourceByte = source + (sourceFirst >> 3);
-    const bool upwards =
-        targetByte == sourceByte ? (targetFirst & 7) <= (sourceFirst & 7) : std::less<>()(targetByte, sourceByte);
     unsigned char* const whole = target + run.firstWhole;
-    if (upwards) {
-        copyHead();
-        copyWholeBytes(whole, source, wholeFirst, run.wholeBytes, true);
+    if (beginsInside(target, targetFirst, source, sourceFirst, count)) {
         copyTail();
+        copyBytesFromHighEnd(whole, source, wholeFirst, run.wholeBytes);
+        copyHead();
     } else {
-        copyTail();
-        copyWholeBytes(whole, source, wholeFirst, run.wholeBytes, false);
         copyHead();
+        copyBytesFromLowEnd(whole, source, wholeFirst, run.wholeBytes);
+        copyTail();
     }
 }
 

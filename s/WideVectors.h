@@ -1,4 +1,4 @@
-// 32-byte vectors behind a check at run time.
+// 32-byte vectors, and permutations of the bytes of two 64-byte ones, behind a check at run time.
 //
 // The body of a kernel is written once, as a TESSAL_INLINE_BODY template on the block it works with. It is compiled
 // twice: for NarrowBlock into a plain function, and for WideBlock into one marked TESSAL_WIDE. The kernel picks one by
@@ -15,6 +15,7 @@
 #if defined(__GNUC__) && defined(__x86_64__) && !defined(TESSAL_NO_WIDE_VECTORS)
 #define TESSAL_HAS_WIDE 1
 #define TESSAL_WIDE __attribute__((target("avx2")))
+#define TESSAL_PERMUTING __attribute__((target("avx2,avx512f,avx512bw,avx512vbmi")))
 #include <immintrin.h>
 #else
 #define TESSAL_HAS_WIDE 0
@@ -36,6 +37,13 @@ extern bool wideVectors;
 
 inline bool hasWideVectors() {
     return wideVectors;
+}
+
+/// The same for what functions marked TESSAL_PERMUTING need beside wide vectors.
+extern bool bytePermutations;
+
+inline bool hasBytePermutations() {
+    return wideVectors && bytePermutations;
 }
 
 template <class Block>

@@ -5,11 +5,18 @@
 
 class VectorWidth {
 public:
-    explicit VectorWidth(bool wide) { wideVectors = wideVectors && wide; }
-    ~VectorWidth() { wideVectors = m_former; }
+    explicit VectorWidth(bool wide, bool permutations = true) {
+        wideVectors = wideVectors && wide;
+        bytePermutations = bytePermutations && permutations;
+    }
+    ~VectorWidth() {
+        wideVectors = m_formerWide;
+        bytePermutations = m_formerPermutations;
+    }
     VectorWidth(const VectorWidth&) = delete;
     VectorWidth& operator=(const VectorWidth&) = delete;
 
 private:
-    const bool m_former = wideVectors;
+    const bool m_formerWide = wideVectors;
+    const bool m_formerPermutations = bytePermutations;
 };

@@ -31,27 +31,41 @@ void eachRun(Check check) {
     }
 }
 
+/// From an array that ends with the run, and inside one.
+void checkCopy(std::size_t first, std::size_t from, std::size_t count) {
+    const Model source = array(std::max(first, from), count);
+    Model target = array(first, count);
+    Model expected = target;
+    Model moved = source;
+    for (std::size_t i = 0; i < count; ++i) {
+        expected.put(first + i, source.bit(from + i));
+        moved.put(first + i, source.bit(from + i));
+    }
+    const auto start = source.bytes.begin();
+    const std::vector<unsigned char> exact(start, start + static_cast<int>(from + count + 7) / 8);
+    copyBits(target.bytes.data(), first, exact.data(), from, count);
+    ASSERT_EQ(target.bytes, expected.bytes) << count << " bits from " << from << " to " << first;
+    Model own = source;
+    copyBits(own.bytes.data(), first, own.bytes.data(), from, count);
+    ASSERT_EQ(own.bytes, moved.bytes) << count << " bits inside, from " << from << " to " << first;
+}
+
 TEST(Kernels, CopyBetweenArraysAndInsideOne) {
     eachRun([](std::size_t first, std::size_t count) {
         for (const std::size_t from : {first, std::size_t{0}, std::size_t{5}, std::size_t{16}, std::size_t{71}}) {
-            const Model source = array(std::max(first, from), count);
-            Model target = array(first, count);
-            Model expected = target;
-            Model moved = source;
-            for (std::size_t i = 0; i < count; ++i) {
-                expected.put(first + i, source.bit(from + i));
-                moved.put(first + i, source.bit(from + i));
-            }
-            // From an array that ends with the run, and inside one.
-            const auto start = source.bytes.begin();
-            const std::vector<unsigned char> exact(start, start + static_cast<int>(from + count + 7) / 8);
-            copyBits(target.bytes.data(), first, exact.data(), from, count);
-            ASSERT_EQ(target.bytes, expected.bytes) << count << " bits from " << from << " to " << first;
-            Model own = source;
-            copyBits(own.bytes.data(), first, own.bytes.data(), from, count);
-            ASSERT_EQ(own.bytes, moved.bytes) << count << " bits inside, from " << from << " to " << first;
+            checkCopy(first, from, count);
         }
     });
+}
+
+TEST(Kernels, CopyOfLongRunsAtAnyPlaceInACacheLine) {
+    for (unsigned trial = 0; trial < 1500; ++trial) {
+        const VectorWidth width(trial % 4 != 0, trial % 2 != 0);
+        const std::size_t first = randomNumber() % 1100;
+        const std::size_t from = trial % 3 == 0 ? randomNumber() % 1100 : first + randomNumber() % 40;
+        checkCopy(first, from, 4000 + randomNumber() % 3000);
+        checkCopy(from, first, 4000 + randomNumber() % 3000);
+    }
 }
 
 TEST(Kernels, FillFindCompareCountAndHash) {
