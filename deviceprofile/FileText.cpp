@@ -85,10 +85,11 @@ const char* problemOfKind(fs::file_type type) {
 
 const char* readBytes(const fs::path& path, FileText& result) {
     std::error_code error;
-    if (const char* const problem = problemOfKind(fs::status(path, error).type())) {
-        return problem;
-    }
     const std::uintmax_t size = fs::file_size(path, error);
+    const char* const kindProblem = error ? problemOfKind(fs::status(path, error).type()) : nullptr;
+    if (kindProblem != nullptr) {
+        return kindProblem;
+    }
     if (!error && size > largestFile) {
         return "is too large";
     }

@@ -14,6 +14,20 @@ char* find(char* begin, const char* end, char ch) {
     return static_cast<char*>(std::memchr(begin, ch, static_cast<std::size_t>(end - begin)));
 }
 
+/// A physical line, without its end.
+struct Piece {
+    char* begin;
+    char* end;
+    char* next;  ///< begin of the next one
+};
+
+Piece pieceAt(char* begin, char* textEnd) {
+    char* const lineFeed = find(begin, textEnd, '\n');
+    char* const end = lineFeed != nullptr ? lineFeed : textEnd;
+    const bool hasReturn = end != begin && end[-1] == '\r';
+    return {begin, end - (hasReturn ? 1 : 0), lineFeed != nullptr ? lineFeed + 1 : textEnd};
+}
+
 bool goesOn(const char* begin, const char* end) {
     return begin != end && end[-1] == '\\';
 }
@@ -26,39 +40,36 @@ LogicalLines::LogicalLines(char* begin, char* end) : m_position(begin), m_end(en
     m_position += isMarked ? byteOrderMarkSize : 0;
 }
 
-LogicalLines::Piece LogicalLines::takePhysicalLine() {
-    Piece piece{m_position, find(m_position, m_end, '\n')};
-    if (piece.end != nullptr) {
-        m_position = piece.end + 1;
-    } else {
-        m_position = piece.end = m_end;
-    }
-    if (piece.end != piece.begin && piece.end[-1] == '\r') {
-        --piece.end;
-    }
-    ++m_number;
-    return piece;
-}
-
 void LogicalLines::joinContinuation(LogicalLine& line) {
-    for (bool open = goesOn(line.begin, line.end); open;) {
-        --line.end;
-        if (m_position == m_end) {
+    // In locals, for what is written through a pointer to characters could be any member.
+    char* position = m_position;
+    char* end = line.end;
+    std::uint32_t number = m_number;
+    for (bool open = goesOn(line.begin, end); open;) {
+        --end;
+        if (position == m_end) {
             line.isCutOff = true;
-            return;
+            break;
         }
-        const Piece piece = takePhysicalLine();
+        const Piece piece = pieceAt(position, m_end);
         open = goesOn(piece.begin, piece.end);
         char* const text = skipBlanks(piece.begin, piece.end);
         const auto length = static_cast<std::size_t>(piece.end - text);
-        std::memmove(line.end, text, length);
-        line.end += length;
+        std::memmove(end, text, length);
+        end += length;
+        position = piece.next;
+        ++number;
     }
+    m_position = position;
+    m_number = number;
+    line.end = end;
 }
 
 bool LogicalLines::next(LogicalLine& line) {
     while (m_position != m_end) {
-        const Piece piece = takePhysicalLine();
+        const Piece piece = pieceAt(m_position, m_end);
+        m_position = piece.next;
+        ++m_number;
         char* const begin = skipBlanks(piece.begin, piece.end);
         if (begin == piece.end || *begin == '#' || *begin == ';') {
             continue;

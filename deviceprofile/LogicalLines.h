@@ -24,12 +24,6 @@ public:
     bool next(LogicalLine& line);
 
 private:
-    struct Piece {
-        char* begin;
-        char* end;
-    };
-
-    Piece takePhysicalLine();
     void joinContinuation(LogicalLine& line);
 
     char* m_position;
