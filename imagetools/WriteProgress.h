@@ -20,12 +20,10 @@ public:
     }
     WriteProgress(const WriteProgress&) = delete;
     WriteProgress& operator=(const WriteProgress&) = delete;
-    /// An end with fewer steps than there are says that the run has failed.
+    /// Without complete() the run has failed.
     ~WriteProgress() {
-        Callback* const record = ProgressInterfaceClass::getCBData();
-        if (!m_isDone && record != nullptr) {
-            record->setProgressStatus(PROGRESS_END);
-            ProgressInterfaceClass::callCallbackFunction();
+        if (!m_isDone) {
+            ProgressInterfaceClass::stopProgressUpdate();
         }
     }
 

@@ -25,6 +25,8 @@ public:
     static bool setProgressText(const char* text);
     /// The operation has ended, whatever number of steps was done. False, without a call, where it has no steps.
     static bool endProgressUpdate();
+    /// The operation has ended where it stands, short of its steps: it failed or was stopped.
+    static bool stopProgressUpdate();
 
     static void setTessalMode(tESSALNS::MODE_TYPE mode);
     static void setTessalSubMode(tESSALNS::SUBMODE_TYPE subMode);

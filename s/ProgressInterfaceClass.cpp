@@ -74,6 +74,13 @@ bool ProgressInterfaceClass::endProgressUpdate() {
     return callCallbackFunction();
 }
 
+bool ProgressInterfaceClass::stopProgressUpdate() {
+    if (m_cbData != nullptr) {
+        m_cbData->setProgressStatus(PROGRESS_END);
+    }
+    return callCallbackFunction();
+}
+
 void ProgressInterfaceClass::setTessalMode(tESSALNS::MODE_TYPE mode) {
     if (m_cbData != nullptr) {
         m_cbData->setMode(mode);

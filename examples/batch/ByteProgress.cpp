@@ -20,10 +20,9 @@ ByteProgress::ByteProgress(const char* title, std::uint64_t total) : m_total(tot
 ByteProgress::~ByteProgress() {
     if (m_done == m_total) {
         ProgressInterfaceClass::endProgressUpdate();
-        return;
+    } else {
+        ProgressInterfaceClass::stopProgressUpdate();
     }
-    ProgressInterfaceClass::getCBData()->setProgressStatus(PROGRESS_END);
-    ProgressInterfaceClass::callCallbackFunction();
 }
 
 void ByteProgress::add(std::uint64_t bytes) {
