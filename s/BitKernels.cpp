@@ -166,6 +166,28 @@ bool beginsInside(const unsigned char* target, std::size_t targetFirst, const un
     return std::less<>()(source, target) && std::less<>()(target, source + sourceBytes);
 }
 
+// ---- Counting.
+
+TESSAL_INLINE_BODY std::size_t onesOf(Word word) {
+    return static_cast<std::size_t>(__builtin_popcountll(word));
+}
+
+TESSAL_INLINE_BODY std::size_t countOnesBody(const unsigned char* bytes, std::size_t first, std::size_t count) {
+    const Run run(first, count);
+    std::size_t ones = run.headBits != 0 ? onesOf(bytes[run.headByte] & run.headMask) : 0;
+    std::size_t i = run.firstWhole;
+    for (; i + sizeof(Word) <= run.tailByte; i += sizeof(Word)) {
+        ones += onesOf(loadWord(bytes + i));
+    }
+    ones += onesOf(loadPart(bytes + i, run.tailByte - i));
+    return ones + (run.tailBits != 0 ? onesOf(bytes[run.tailByte] & run.tailMask) : 0);
+}
+
+/// A processor with wide vectors counts a word in one instruction.
+TESSAL_WIDE std::size_t countOnesWide(const unsigned char* bytes, std::size_t first, std::size_t count) {
+    return countOnesBody(bytes, first, count);
+}
+
 }  // namespace
 
 Word readBits(const unsigned char* bytes, std::size_t first, std::size_t count) {
@@ -277,12 +299,7 @@ std::size_t findBit(const unsigned char* bytes, std::size_t first, std::size_t c
 }
 
 std::size_t countOnes(const unsigned char* bytes, std::size_t first, std::size_t count) {
-    std::size_t ones = 0;
-    for (std::size_t done = 0; done < count; done += wordBits) {
-        const std::size_t part = count - done < wordBits ? count - done : wordBits;
-        ones += static_cast<std::size_t>(__builtin_popcountll(readBits(bytes, first + done, part)));
-    }
-    return ones;
+    return hasWideVectors() ? countOnesWide(bytes, first, count) : countOnesBody(bytes, first, count);
 }
 
 std::size_t hashBits(const unsigned char* bytes, std::size_t first, std::size_t count) {

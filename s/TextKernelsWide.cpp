@@ -1,4 +1,5 @@
-// The inner loops between text and bytes for processors with 32-byte vectors. Each loop ends in the portable form.
+// The inner loops between text and bytes for processors with 32-byte vectors. What is left over behind the last whole
+// block is done by the portable form or, for hex text, by one more block that ends there.
 #include "s/TextKernels.h"
 
 #include "s/WideVectors.h"
@@ -22,6 +23,10 @@ TESSAL_WIDE inline __m128i load16(const void* from) {
 
 TESSAL_WIDE inline void store32(void* to, __m256i value) {
     _mm256_storeu_si256(static_cast<__m256i*>(to), value);
+}
+
+TESSAL_WIDE inline void store16(void* to, __m128i value) {
+    _mm_storeu_si128(static_cast<__m128i*>(to), value);
 }
 
 /// A table of 16 bytes, once in each half.
@@ -80,24 +85,51 @@ TESSAL_WIDE inline __m256i digitPairs(__m256i text, __m256i& seen) {
     }
 }
 
-template <bool lastByteFirst, bool mirrorBits>
-TESSAL_WIDE bool decodeHex(const char* text, std::size_t count, unsigned char* to) {
-    __m256i seen = _mm256_set1_epi8(1);
-    std::size_t i = 0;
-    for (; i + 32 <= count; i += 32) {
-        const __m256i first = digitPairs<mirrorBits>(load32(text + 2 * i), seen);
-        const __m256i second = digitPairs<mirrorBits>(load32(text + 2 * i + 32), seen);
-        const __m256i bytes = _mm256_packus_epi16(first, second);  // quarters 0 and 2 of the text, then 1 and 3
-        if constexpr (lastByteFirst) {
-            store32(to + count - 32 - i, _mm256_shuffle_epi8(_mm256_permute4x64_epi64(bytes, 0x8D), backward()));
-        } else {
-            store32(to + i, _mm256_permute4x64_epi64(bytes, 0xD8));
-        }
+/// Where block @p i of the text goes among @p count bytes.
+template <bool lastByteFirst>
+unsigned char* placeOf(std::size_t i, std::size_t size, std::size_t count, unsigned char* to) {
+    return lastByteFirst ? to + count - size - i : to + i;
+}
+
+/// Decodes what becomes bytes @p i to @p i + size of the text, 32 or 16 of them.
+template <std::size_t size, bool lastByteFirst, bool mirrorBits>
+TESSAL_WIDE inline void decodeBlock(const char* text, std::size_t i, std::size_t count, unsigned char* to,
+                                    __m256i& seen) {
+    unsigned char* const place = placeOf<lastByteFirst>(i, size, count, to);
+    const __m256i first = digitPairs<mirrorBits>(load32(text + 2 * i), seen);
+    const __m256i second = size == 32 ? digitPairs<mirrorBits>(load32(text + 2 * i + 32), seen) : first;
+    const __m256i quarters = _mm256_packus_epi16(first, second);  // 0 and 2 of the text, then 1 and 3
+    const __m256i bytes = lastByteFirst ? _mm256_shuffle_epi8(_mm256_permute4x64_epi64(quarters, 0x8D), backward())
+                                        : _mm256_permute4x64_epi64(quarters, 0xD8);
+    if constexpr (size == 32) {
+        store32(place, bytes);
+    } else {  // both halves are the same
+        store16(place, _mm256_castsi256_si128(bytes));
     }
-    const bool allDigits = _mm256_movemask_epi8(_mm256_cmpeq_epi8(seen, _mm256_setzero_si256())) == 0;
-    return portableTextKernels().decodeHex(text + 2 * i, count - i, {lastByteFirst, mirrorBits},
-                                           lastByteFirst ? to : to + i) &&
-           allDigits;
+}
+
+/// At least one block; the last one begins inside the one before where the count is no multiple of the size.
+template <std::size_t size, bool lastByteFirst, bool mirrorBits>
+TESSAL_WIDE bool decodeInBlocks(const char* text, std::size_t count, unsigned char* to) {
+    __m256i seen = _mm256_set1_epi8(1);
+    for (std::size_t i = 0; i + size <= count; i += size) {
+        decodeBlock<size, lastByteFirst, mirrorBits>(text, i, count, to, seen);
+    }
+    if (count % size != 0) {
+        decodeBlock<size, lastByteFirst, mirrorBits>(text, count - size, count, to, seen);
+    }
+    return _mm256_movemask_epi8(_mm256_cmpeq_epi8(seen, _mm256_setzero_si256())) == 0;
+}
+
+template <bool lastByteFirst, bool mirrorBits>
+bool decodeHex(const char* text, std::size_t count, unsigned char* to) {
+    if (count >= 32) {
+        return decodeInBlocks<32, lastByteFirst, mirrorBits>(text, count, to);
+    }
+    if (count >= 16) {
+        return decodeInBlocks<16, lastByteFirst, mirrorBits>(text, count, to);
+    }
+    return portableTextKernels().decodeHex(text, count, {lastByteFirst, mirrorBits}, to);
 }
 
 bool decodeHexInOrder(const char* text, std::size_t count, ByteOrder order, unsigned char* to) {
@@ -122,17 +154,26 @@ TESSAL_WIDE inline __m256i digitsOf(__m128i bytes) {
 }
 
 template <bool lastByteFirst, bool mirrorBits>
-TESSAL_WIDE void encodeHex(const unsigned char* from, std::size_t count, char* text) {
-    std::size_t i = 0;
-    for (; i + 16 <= count; i += 16) {
-        __m128i bytes = load16(from + (lastByteFirst ? count - 16 - i : i));
-        if constexpr (lastByteFirst) {
-            bytes = _mm_shuffle_epi8(bytes, _mm256_castsi256_si128(backward()));
-        }
-        store32(text + 2 * i, digitsOf<mirrorBits>(bytes));
+TESSAL_WIDE inline void encodeBlock(const unsigned char* from, std::size_t i, std::size_t count, char* text) {
+    __m128i bytes = load16(from + (lastByteFirst ? count - 16 - i : i));
+    if constexpr (lastByteFirst) {
+        bytes = _mm_shuffle_epi8(bytes, _mm256_castsi256_si128(backward()));
     }
-    portableTextKernels().encodeHex(lastByteFirst ? from : from + i, count - i, {lastByteFirst, mirrorBits},
-                                    text + 2 * i);
+    store32(text + 2 * i, digitsOf<mirrorBits>(bytes));
+}
+
+template <bool lastByteFirst, bool mirrorBits>
+TESSAL_WIDE void encodeHex(const unsigned char* from, std::size_t count, char* text) {
+    if (count < 16) {
+        portableTextKernels().encodeHex(from, count, {lastByteFirst, mirrorBits}, text);
+        return;
+    }
+    for (std::size_t i = 0; i + 16 <= count; i += 16) {
+        encodeBlock<lastByteFirst, mirrorBits>(from, i, count, text);
+    }
+    if (count % 16 != 0) {
+        encodeBlock<lastByteFirst, mirrorBits>(from, count - 16, count, text);
+    }
 }
 
 void encodeHexInOrder(const unsigned char* from, std::size_t count, ByteOrder order, char* text) {

@@ -4,7 +4,7 @@ namespace {
 
 bool processorHasWideVectors() {
 #if TESSAL_HAS_WIDE
-    return __builtin_cpu_supports("avx2") != 0;
+    return __builtin_cpu_supports("avx2") != 0 && __builtin_cpu_supports("popcnt") != 0;
 #else
     return false;
 #endif

@@ -14,7 +14,7 @@
 
 #if defined(__GNUC__) && defined(__x86_64__) && !defined(TESSAL_NO_WIDE_VECTORS)
 #define TESSAL_HAS_WIDE 1
-#define TESSAL_WIDE __attribute__((target("avx2")))
+#define TESSAL_WIDE __attribute__((target("avx2,popcnt")))
 #define TESSAL_PERMUTING __attribute__((target("avx2,avx512f,avx512bw,avx512vbmi")))
 #include <immintrin.h>
 #else
