@@ -40,8 +40,18 @@ else()
         set(CPACK_DEBIAN_${upper}_PACKAGE_SECTION ${section} PARENT_SCOPE)
         set(CPACK_DEBIAN_${upper}_DESCRIPTION "${package_CONTENT}" PARENT_SCOPE)
         set(CPACK_COMPONENT_${upper}_DEPENDS ${package_DEPENDS} PARENT_SCOPE)
-        install(FILES LICENSE DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/${name} COMPONENT ${component} RENAME copyright)
+        set(documents ${CMAKE_INSTALL_DATADIR}/doc/${name})
+        install(FILES LICENSE DESTINATION ${documents} COMPONENT ${component} RENAME copyright)
+        install(FILES ${PROJECT_BINARY_DIR}/packaging/changelog.gz DESTINATION ${documents} COMPONENT ${component})
     endfunction()
+
+    string(TIMESTAMP changelog_date "%a, %d %b %Y %H:%M:%S +0000" UTC)
+    configure_file(cmake/debian-changelog.in packaging/changelog @ONLY)
+    tessal_compress(${PROJECT_BINARY_DIR}/packaging/changelog ${PROJECT_BINARY_DIR}/packaging/changelog.gz)
+
+    # The host's cache of libraries is renewed by dpkg's trigger.
+    file(CONFIGURE OUTPUT packaging/triggers CONTENT "activate-noawait ldconfig\n")
+    set(CPACK_DEBIAN_LIBRARY_PACKAGE_CONTROL_EXTRA ${PROJECT_BINARY_DIR}/packaging/triggers)
 
     # The name of the library's package ends in the number of its SONAME.
     tessal_debian_package(library libtessalutility${PROJECT_VERSION_MAJOR} libs
