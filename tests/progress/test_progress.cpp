@@ -66,8 +66,12 @@ TEST_F(Progress, ReachesTheFunctionOnceForEachPercent) {
     ProgressInterfaceClass::setProgressText("still");
     ProgressInterfaceClass::setProgressText("still");
     ProgressInterfaceClass::endProgressUpdate();
+    ProgressInterfaceClass::startProgressUpdate(1000);
+    ProgressInterfaceClass::updateProgress();
+    ProgressInterfaceClass::stopProgressUpdate();
     EXPECT_THAT(calls, ElementsAre(Call{PROGRESS_START, 0}, Call{PROGRESS_UPDATE, 1}, Call{PROGRESS_UPDATE, 10},
-                                   Call{PROGRESS_TEXT, 10}, Call{PROGRESS_TEXT, 10}, Call{PROGRESS_END, 1000}));
+                                   Call{PROGRESS_TEXT, 10}, Call{PROGRESS_TEXT, 10}, Call{PROGRESS_END, 1000},
+                                   Call{PROGRESS_START, 0}, Call{PROGRESS_UPDATE, 1}, Call{PROGRESS_END, 1}));
 }
 
 TEST_F(Progress, ASilenceOfMoreThanTenSecondsLetsTheSamePercentThrough) {
