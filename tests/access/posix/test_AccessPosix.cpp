@@ -168,11 +168,17 @@ TEST(AccessFork, ChildNeitherGivesBackNorTakes) {
     Access access(port, Access::SHARE);
     ASSERT_TRUE(access.lock());
     const MessageRecorder silence;
+    const int ended = inChild([&] {
+        access.~Access();  // as in a child that returns while the object counts as the holder
+        return 0;
+    });
+    EXPECT_EQ(ended, 0);
+    EXPECT_FALSE(isFree(port));
     const int status = inChild([&] {
         Access copy(access);
         Access own(port, Access::SHARE);
         const bool isInert = !access.unlock() && !access.cleanLock() && !access.lock() && !copy.lock() && !own.lock();
-        access.~Access();  // gives nothing back either, or there were a unit too many for the next line
+        access.~Access();  // the parent's object ends here; the child goes on without it
         return isInert && own.cleanLock() && own.lock() ? 0 : 1;  // which its destructor gives back
     });
     EXPECT_EQ(status, 0);
