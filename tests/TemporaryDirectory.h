@@ -39,11 +39,11 @@ public:
         if (const std::size_t end = name.rfind('/'); end != std::string::npos) {
             make(name.substr(0, end));
         }
-        std::ofstream(*this / name, std::ios::binary) << content;
+        std::ofstream(std::filesystem::u8path(*this / name), std::ios::binary) << content;
         return *this / name;
     }
     std::string read(const std::string& name) const {
-        std::ifstream file(*this / name, std::ios::binary);
+        std::ifstream file(std::filesystem::u8path(*this / name), std::ios::binary);
         return {std::istreambuf_iterator<char>(file), {}};
     }
 

@@ -66,12 +66,19 @@ inline Lines dump(const HkCmdArgs& args, const char* format) {
     }
     const std::vector<HkCmdArgInfo> infos = HkCmdArgs::describe(format);
     for (const HkString& name : args.order()) {
-        for (const HkCmdArgInfo& info : infos) {
-            const std::string line = info.names[0] == name ? dumpOne(args, info, format) : std::string();
-            if (!line.empty() && std::find(lines.begin(), lines.end(), line) == lines.end()) {
-                lines.push_back(line);
-            }
+        const auto info =
+            std::find_if(infos.begin(), infos.end(), [&](const auto& one) { return one.names[0] == name; });
+        const std::string line = dumpOne(args, *info, format);
+        if (std::find(lines.begin(), lines.end(), line) == lines.end()) {
+            lines.push_back(line);
         }
     }
     return lines;
+}
+
+/// What a command line gives.
+inline Lines parse(const char* format, const std::string& line) {
+    const Lines words = splitCommand(line);
+    return dump(HkCmdArgs(static_cast<int>(words.size()), pointersTo(words).data(), format, nullptr, HkCmdArgs::Quiet),
+                format);
 }

@@ -3,6 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <fstream>
 #include <string>
 #include <tuple>
 #include <utility>
@@ -20,31 +21,44 @@ using testing::SizeIs;
 constexpr const char* program =
     "'Programs devices.' -p|-position <device=int 1..255>... 'device positions' [-e|-erase 'erase first'] "
     "[-format <mcs|exo|tek>] [-ver <revision=group 0|1 rp code*>]... [{-fast -slow}] [<file> 'the device''s image']";
+const std::string usageLine =
+    "usage: program -p|-position <device>... [-e|-erase] [-format <mcs|exo|tek>] [-ver <revision>]... [-fast | -slow] "
+    "[<file>]\n";
 
 int calls = 0;
 void countCall() {
     ++calls;
 }
 
-Lines parse(const char* format, const std::string& line) {
-    const Lines words = splitCommand(line);
-    return dump(HkCmdArgs(static_cast<int>(words.size()), pointersTo(words).data(), format, nullptr, HkCmdArgs::Quiet),
-                format);
-}
-
-Lines completions(const char* format, const std::string& line, const char* partial) {
-    Lines words = splitCommand(line);
-    words.emplace_back(partial);
-    const std::vector<HkString> found =
-        HkCmdArgs::complete(static_cast<int>(words.size()), pointersTo(words).data(), format);
-    return {found.begin(), found.end()};
+// The blocks of docs/argument-format.md hold formats, commands, and what these give.
+TEST(HkCmdArgs, GivesWhatTheDocumentShows) {
+    std::ifstream file(SHIPPED_DATA_DIR "/../docs/argument-format.md");
+    Lines shown;
+    Lines given;
+    std::string format;
+    bool inside = false;
+    for (std::string line; std::getline(file, line);) {
+        line.erase(line.find_last_not_of(" \r") + 1);
+        if (line.rfind("```", 0) == 0) {
+            inside = line == "```args";
+        } else if (inside) {
+            const bool isCommand = line.rfind("$ ", 0) == 0;
+            const bool isFormat = line.rfind("format ", 0) == 0;
+            format = isFormat ? line.substr(7) : format;
+            shown.push_back(line);
+            given.insert(given.end(), isCommand || isFormat ? 1 : 0, line);
+            const Lines results = isCommand ? parse(format.c_str(), line.substr(2)) : Lines();
+            given.insert(given.end(), results.begin(), results.end());
+        }
+    }
+    EXPECT_GT(shown.size(), 80U);
+    EXPECT_EQ(given, shown);
 }
 
 TEST(HkCmdArgs, MalformedFormatsTellPlaceAndReason) {
     const std::pair<const char*, const char*> cases[] = {
         {"-p <n=itn>", "character 4: unknown type itn"},
         {"-p <n=int 5..1>", "character 4: expected a range such as 1..255, not 5..1"},
-        {"-p <n=int ..>", "character 4: expected a range such as 1..255, not .."},
         {"-p <hex 0>", "character 4: expected a range such as 1..255, not 0"},
         {"-p <n=int 1..2 3>", "character 4: unexpected 3"},
         {"-p <group |>", "character 4: expected the first words of the group, such as group 0|1 rp wp"},
@@ -106,11 +120,8 @@ TEST(HkCmdArgs, ReadsTypedValues) {
     const HkCmdArgs args(9, argv, "-n|-number <text>... [-u <hex>] [-x <mcs|exo>] [<file>]", nullptr, 0);
     ASSERT_EQ(args.iserror(), 0);
     EXPECT_STREQ(args.command(), "CMD");
-    EXPECT_EQ(args.integer("-NUMBER", 0), -2);
-    EXPECT_EQ(args.integer("-n", 1), 16);
-    EXPECT_EQ(args.hex("-n", 2), 0xABCU);
-    EXPECT_EQ(args.integer("-n", 2, 7), 7);
-    EXPECT_EQ(args.hex("-u"), 0xFFFFFFFFFFFFFFFFU);
+    EXPECT_TRUE(args.integer("-NUMBER", 0) == -2 && args.integer("-n", 1) == 16 && args.integer("-n", 2, 7) == 7);
+    EXPECT_TRUE(args.hex("-n", 2) == 0xABC && args.hex("-u") == UINT64_MAX);
     EXPECT_STREQ(args.text("-x"), "exo");
     EXPECT_THAT(args.list("-n"), ElementsAre("-2", "0x10", "abc"));
     for (const char* const absent : {"file", "-none", "", static_cast<const char*>(nullptr)}) {
@@ -134,9 +145,7 @@ TEST(HkCmdArgs, ReportsEachErrorAsInfoThenTheUsageLine) {
                             "program: -e|-erase takes no value, but was given \"1\"\n",
                             "program: -e|-erase is given more than once\n",
                             "program: -p|-position <device>... is missing: device positions\n",
-                            "program: -fast and -slow exclude each other\n",
-                            "usage: program -p|-position <device>... [-e|-erase] [-format <mcs|exo|tek>] "
-                            "[-ver <revision>]... [-fast | -slow] [<file>]\n"));
+                            "program: -fast and -slow exclude each other\n", usageLine));
     EXPECT_EQ(recorder.all().front().file, "../s/HkCmdArgs");
     EXPECT_EQ(calls, 1);
     EXPECT_THAT(args.errors(), SizeIs(7));
@@ -158,11 +167,10 @@ TEST(HkCmdArgs, FlagsAndCallback) {
 
 TEST(HkCmdArgs, BadCallsAreErrors) {
     const char* const holes[] = {"cmd", nullptr, "-p", nullptr, "2"};
-    const char* const noCommand[] = {nullptr, "-p"};
     const std::tuple<int, const char* const*, const char*, Lines> cases[] = {
         {-5, holes, "-p <int>", {"! there is no command word"}},
         {5, nullptr, "-p <int>", {"! there is no command word"}},
-        {2, noCommand, "-p <int>", {"! there is no command word"}},
+        {1, holes + 1, "-p <int>", {"! there is no command word"}},
         {5, holes, nullptr, {"! there is no argument format"}},
         {5, holes, "-p <int>", {"! argument 1 is null", "! argument 3 is null"}},
     };
@@ -207,19 +215,18 @@ TEST(HkCmdArgs, HundredThousandSwitchesAndFormatsBeyondTheCache) {
 }
 
 TEST(HkCmdArgs, HelpSaysWhatEachArgumentIs) {
-    EXPECT_EQ(HkCmdArgs::help("program", program),
-              "usage: program -p|-position <device>... [-e|-erase] [-format <mcs|exo|tek>] [-ver <revision>]... "
-              "[-fast | -slow] [<file>]\n"
-              "\n"
-              "Programs devices.\n"
-              "\n"
-              "  -p|-position <device>...  device positions (an integer from 1 to 255)\n"
-              "  -e|-erase                 erase first\n"
-              "  -format <mcs|exo|tek>     one of mcs, exo, tek\n"
-              "  -ver <revision>           one argument of the form \"0|1 [rp] [code:<text>]\"\n"
-              "  -fast\n"
-              "  -slow\n"
-              "  <file>                    the device's image (a file name)\n");
+    EXPECT_EQ(HkCmdArgs::help("program", program).view(),
+              usageLine +
+                  "\n"
+                  "Programs devices.\n"
+                  "\n"
+                  "  -p|-position <device>...  device positions (an integer from 1 to 255)\n"
+                  "  -e|-erase                 erase first\n"
+                  "  -format <mcs|exo|tek>     one of mcs, exo, tek\n"
+                  "  -ver <revision>           one argument of the form \"0|1 [rp] [code:<text>]\"\n"
+                  "  -fast\n"
+                  "  -slow\n"
+                  "  <file>                    the device's image (a file name)\n");
     EXPECT_EQ(HkCmdArgs::usage(nullptr, "(-a)... {\"\" <b>...} -c [<int>...]"),
               "usage:  (-a)... {\"\" | <b>...} -c [<int>...]");
     EXPECT_EQ(HkCmdArgs::help("c", "-an-unusually-long-name|-alias <value> 'help' -b"),
@@ -243,7 +250,10 @@ TEST(HkCmdArgs, CompletesWhatMayComeNext) {
         {words, "cmd on", "", {"all"}},
     };
     for (const auto& [format, line, partial, expected] : cases) {
-        EXPECT_EQ(completions(format, line, partial), expected) << line << " " << partial;
+        Lines given = splitCommand(line);
+        given.emplace_back(partial);
+        const auto found = HkCmdArgs::complete(static_cast<int>(given.size()), pointersTo(given).data(), format);
+        EXPECT_EQ(Lines(found.begin(), found.end()), expected) << line << " " << partial;
     }
 }
 

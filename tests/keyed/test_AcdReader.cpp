@@ -17,9 +17,9 @@ static_assert(sizeof(AcdReader) == 2 * sizeof(void*));
 class Reader : public KeyedFiles {
 protected:
     Reader() {
-        writeFile(m_directory / "tessal.acd",
-                  "[base]\nNAME = base\nYES = TRUE\nLOWER = true\nLONGER = TRUE FALSE\nNUMBER = 4096\n"
-                  "LIST = 16,-32, 48,x\nONE = 7\nNOTHING =\n[xz7s10]\nNAME = device\n");
+        m_directory.write("tessal.acd",
+                          "[base]\nNAME = base\nYES = TRUE\nLOWER = true\nLONGER = TRUE FALSE\nNUMBER = 4096\n"
+                          "LIST = 16,-32, 48,x\nONE = 7\nNOTHING =\n[xz7s10]\nNAME = device\n");
     }
 };
 
@@ -58,7 +58,7 @@ TEST_F(Reader, ListsEndWithTheHighestIndex) {
     for (int i = 1; i < 40000; ++i) {
         list += "," + std::to_string(i);
     }
-    writeFile(m_directory / "tessal.acd", list);
+    m_directory.write("tessal.acd", list);
     const AcdReader reader;
     EXPECT_THAT(reader.getLongVectorByKey("LIST"), SizeIs(32768));
     EXPECT_STREQ(openTable("tessal.acd")->getstringbykey("LIST", ",", SHRT_MAX, nullptr, 0), "32767");

@@ -23,12 +23,12 @@ std::string taken(char* text) {
 class Config : public KeyedFiles {
 protected:
     Config() {
-        writeFile(m_directory / "tessal.acd", "[base]\nA = 1\n[xz7s10]\nA = 2\n[xz7s20]\n[base]\n[Brennwick-1]\n");
-        writeFile(m_directory / "proms.dat", "");
-        writeFile(m_directory / "guide.txt", "");
+        m_directory.write("tessal.acd", "[base]\nA = 1\n[xz7s10]\nA = 2\n[xz7s20]\n[base]\n[Brennwick-1]\n");
+        m_directory.write("proms.dat", "");
+        m_directory.write("guide.txt", "");
     }
 
-    std::string path(const char* name) const { return (m_directory / name).u8string(); }
+    std::string path(const char* name) const { return (fs::u8path(m_directory.path()) / name).u8string(); }
 
     DeviceProfile::ProfileConfig m_config{"xz7s10", 1, ProfilePartBound};
 };

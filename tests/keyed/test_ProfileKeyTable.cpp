@@ -9,7 +9,7 @@ namespace {
 using KeyTable = KeyedFiles;
 
 TEST_F(KeyTable, FindsCellsBySeparatorsAndIndexes) {
-    writeFile(m_directory / "cells.acd", "[base]\nW = one\nTAB = a,b:c,,d:,:e\nE =\nL = x::y:z::\n");
+    m_directory.write("cells.acd", "[base]\nW = one\nTAB = a,b:c,,d:,:e\nE =\nL = x::y:z::\n");
     constexpr const char* no = nullptr;
     // A key, the separator and index of the row and of the field, the cell or null.
     const std::tuple<const char*, const char*, short, const char*, short, const char*> cases[] = {
@@ -35,10 +35,10 @@ TEST_F(KeyTable, FindsCellsBySeparatorsAndIndexes) {
 }
 
 TEST_F(KeyTable, TextsLiveAsLongAsTheTable) {
-    writeFile(m_directory / "lasting.acd", "[base]\nA = 1,2\nB = 3,4\n");
+    m_directory.write("lasting.acd", "[base]\nA = 1,2\nB = 3,4\n");
     const auto table = openTable("lasting.acd");
     const char* const field = table->getstringbykey("A", ",", 1, nullptr, 0);
-    const char* const whole = table->getstringbykey("A", nullptr, 0, nullptr, 0);
+    const char* const whole = valueOf(*table, "A");
     for (const char* const separator : {",", ";", "1", "2", "A"}) {
         table->getstringbykey("B", separator, 0, nullptr, 0);
         table->getstringbykey("A", separator, 0, nullptr, 0);
@@ -52,7 +52,7 @@ TEST_F(KeyTable, FindsManyKeysAndTheLastValueOfEach) {
     for (int i = 0; i < 6000; ++i) {
         bytes += "KEY_" + std::to_string(i % 4000) + " = x:" + std::to_string(i) + "\n";
     }
-    writeFile(m_directory / "many.acd", bytes);
+    m_directory.write("many.acd", bytes);
     const MessageRecorder messages;  // keys that are set twice
     const auto table = openTable("many.acd");
     for (int i = 0; i < 4000; ++i) {
@@ -62,19 +62,14 @@ TEST_F(KeyTable, FindsManyKeysAndTheLastValueOfEach) {
 }
 
 TEST_F(KeyTable, NeedsTheSelectionOnlyWhileItOpensAndTakesBaseWithoutOne) {
-    writeFile(m_directory / "profiles.acd", "[base]\nA = base\n[xz1]\nA = device\n");
-    auto config =
-        std::make_unique<DeviceProfile::ProfileConfig>("xz1", static_cast<unsigned char>(1), ProfilePartUnbound);
-    constexpr unsigned char on = 1;
-    ProfileKeyTable device("profiles.acd", config.get(), on, on, on);
-    config.reset();
-    EXPECT_STREQ(device.getstringbykey("A", nullptr, 0, nullptr, 0), "device");
-    ProfileKeyTable unselected("profiles.acd", nullptr, on, on, on);
-    EXPECT_STREQ(unselected.getstringbykey("A", nullptr, 0, nullptr, 0), "base");
+    m_directory.write("profiles.acd", "[base]\nA = base\n[xz1]\nA = device\n");
+    EXPECT_STREQ(valueOf(*openTable("profiles.acd", "xz1"), "A"), "device");
+    ProfileKeyTable unselected("profiles.acd", nullptr, 1, 1, 1);
+    EXPECT_STREQ(valueOf(unselected, "A"), "base");
 }
 
 TEST_F(KeyTable, FlagsSilenceTheMessages) {
-    writeFile(m_directory / "faults.acd", "[base]\nA = 1\nA = 2\nx\n");
+    m_directory.write("faults.acd", "[base]\nA = 1\nA = 2\nx\n");
     DeviceProfile::ProfileConfig base("base", 1, ProfilePartBound);
     MessageRecorder messages;
     for (int flags = 0; flags < 8; ++flags) {
