@@ -7,6 +7,7 @@
 #include <memory>
 #include <sstream>
 #include <string>
+#include <tuple>
 #include <utility>
 #include <vector>
 
@@ -60,15 +61,11 @@ const std::pair<const char*, const char*> tokeniserCases[] = {
     {"a #b", "a|#b"}, {"\"\" cmd \"\" x", "cmd|x"},
 };
 
-TEST(CommandSet, SplitsALine) {
+TEST(CommandSet, SplitsALineAndRefusesAnOpenQuotation) {
     EXPECT_EQ(split(nullptr), Words());
     for (const auto& [line, words] : tokeniserCases) {
         EXPECT_EQ(joined(split(line)), words) << line;
-        EXPECT_EQ(split(line), splitByModel(line)) << line;
     }
-}
-
-TEST(CommandSet, RefusesAnOpenQuotation) {
     const MessageRecorder messages;
     EXPECT_THROW(CommandSet::string2CommandSet("cmd x\"abc d"), DataMismatchException);
     EXPECT_THROW(CommandSet::string2CommandSet("\""), DataMismatchException);
@@ -152,16 +149,10 @@ TEST(CommandSet, CopiesAreIndependent) {
     EXPECT_THROW(source.resetCommand(2, "c"), OutOfRangeException);
 }
 
-struct PositionCase {
-    const char* before;
-    const char* incremented;
-    const char* decremented;
-    const char* message;  ///< of decrementPositions, which then yields false; null where it yields true
-};
-
 constexpr const char* lowest = "Position should start from 1.\n";
 constexpr const char* noNumber = "Expect an integer after -p|-position.\n";
-const PositionCase positionCases[] = {
+// The tokens, then what they are a position higher, and a position lower, with the message of a refused step down.
+const std::tuple<const char*, const char*, const char*, const char*> positionCases[] = {
     {"cmd|3", "cmd|3", "cmd|3", nullptr},
     {"assign|-p|1|2|-file|x|3", "assign|-p|2|3|-file|x|3", "assign|-p|0|1|-file|x|3", nullptr},
     {"-POSITION|9", "-POSITION|10", "-POSITION|8", nullptr},
@@ -174,15 +165,15 @@ const PositionCase positionCases[] = {
 };
 
 TEST(CommandSet, MovesPositionsByOne) {
-    for (const PositionCase& c : positionCases) {
+    for (const auto& [before, incremented, decremented, message] : positionCases) {
         const MessageRecorder messages;
-        CommandSet up = setOf(c.before);
-        EXPECT_TRUE(up.incrementPositions() && messages.all().empty()) << c.before;
-        EXPECT_EQ(joined(wordsOf(up)), c.incremented);
-        CommandSet down = setOf(c.before);
-        EXPECT_EQ(down.decrementPositions(), c.message == nullptr) << c.before;
-        EXPECT_EQ(joined(wordsOf(down)), c.decremented);
-        EXPECT_EQ(messages.info(), c.message != nullptr ? Words{c.message} : Words()) << c.before;
+        CommandSet up = setOf(before);
+        EXPECT_TRUE(up.incrementPositions() && messages.all().empty()) << before;
+        EXPECT_EQ(joined(wordsOf(up)), incremented);
+        CommandSet down = setOf(before);
+        EXPECT_EQ(down.decrementPositions(), message == nullptr) << before;
+        EXPECT_EQ(joined(wordsOf(down)), decremented);
+        EXPECT_EQ(messages.info(), message != nullptr ? Words{message} : Words()) << before;
     }
     EXPECT_TRUE(CommandSet().incrementPositions() && CommandSet().decrementPositions());
 }

@@ -19,18 +19,12 @@ using testing::ElementsAre;
 using testing::IsSupersetOf;
 
 /// Data files with these rows of commands, looked at as long as it lives.
-class CommandData {
-public:
+struct CommandData : TemporaryDirectory {
     explicit CommandData(const std::string& rows) {
-        m_directory.write("tessal.acd", "[base]\n" + rows + "\n");
-        DeviceProfile::setDataPath(m_directory.path().c_str());
+        write("tessal.acd", "[base]\n" + rows + "\n");
+        DeviceProfile::setDataPath(path().c_str());
     }
     ~CommandData() { DeviceProfile::setDataPath(nullptr); }
-    CommandData(const CommandData&) = delete;
-    CommandData& operator=(const CommandData&) = delete;
-
-private:
-    TemporaryDirectory m_directory;
 };
 
 std::unique_ptr<HkCmdArgs> parse(const char* line, bool strict) {
@@ -40,11 +34,8 @@ std::unique_ptr<HkCmdArgs> parse(const char* line, bool strict) {
 }
 
 std::vector<std::string> matching(const char* prefix) {
-    std::vector<std::string> names;
-    for (const HkString& name : TessalCmdargs::findMatchingCommands(prefix)) {
-        names.emplace_back(name);
-    }
-    return names;
+    const auto names = TessalCmdargs::findMatchingCommands(prefix);
+    return {names.begin(), names.end()};
 }
 
 // The table lives as long as the process and only grows, so this case comes first.

@@ -59,7 +59,7 @@ TEST(HkDir, ListsEveryEntryButItselfAndItsParent) {
     const TemporaryDirectory directory;
     const Names files = {"a.txt", "B.TXT", ".hidden", unicodeName};
     for (const std::string& name : files) {
-        std::fclose(HkFile::open((directory / name).c_str(), "w"));
+        directory.write(name, "");
     }
     EXPECT_EQ(namesIn(directory.path()), files);
     directory.make("sub");

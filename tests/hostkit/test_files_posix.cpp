@@ -79,11 +79,10 @@ TEST(TreeRemoval, GoesOnPastWhatStays) {
     const uid_t user = ::geteuid();
     ASSERT_EQ(::seteuid(user == 0 ? nobody : user), 0);
     const std::string tree = directory.make("tree");
-    const std::string unwritable = directory.write("tree/unwritable/file", "");
-    const std::string unsearchable = directory.write("tree/unsearchable/file", "");
     const std::string unreadable = directory.make("tree/unreadable but empty");
-    directory.write("tree/free/file", "");
-    directory.write("tree/file", "");
+    for (const char* file : {"tree/unwritable/file", "tree/unsearchable/file", "tree/free/file", "tree/file"}) {
+        directory.write(file, "");
+    }
     ::chmod((tree + "/unwritable").c_str(), 0500);
     ::chmod((tree + "/unsearchable").c_str(), 0600);
     ::chmod(unreadable.c_str(), 0);
@@ -92,7 +91,7 @@ TEST(TreeRemoval, GoesOnPastWhatStays) {
     EXPECT_FALSE(isThere(tree + "/free") || isThere(tree + "/file") || isThere(unreadable));
     ::chmod((tree + "/unwritable").c_str(), 0700);
     ::chmod((tree + "/unsearchable").c_str(), 0700);
-    EXPECT_TRUE(isThere(unwritable) && isThere(unsearchable));
+    EXPECT_TRUE(isThere(tree + "/unwritable/file") && isThere(tree + "/unsearchable/file"));
 }
 
 TEST(TreeRemoval, IsNotLedAwayByALinkPutInADirectorysPlace) {

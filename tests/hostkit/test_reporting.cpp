@@ -159,24 +159,16 @@ TEST(Console, ChainsTextsNumbersAndLineEnds) {
     EXPECT_EQ(&HkFile::getCout(), &HkFile::getCout());
 }
 
-template <class Derived, class... Bases>
-constexpr bool derivesFrom = (std::is_base_of_v<Bases, Derived> && ...);
-
-static_assert(derivesFrom<OutOfRangeException, LogicException, TessalException, HkException>);
-static_assert(derivesFrom<DataMismatchException, LogicException>);
-static_assert(derivesFrom<InvalidArgumentException, LogicException>);
-static_assert(derivesFrom<DataNotFoundException, LogicException>);
-static_assert(
-    derivesFrom<ACDEntryNotFoundException, ACDFileException, FileException, StreamException, TessalException>);
-static_assert(!derivesFrom<ACDEntryNotFoundException, LogicException>);
+static_assert(!std::is_base_of_v<LogicException, ACDEntryNotFoundException>);
 static_assert(sizeof(ACDEntryNotFoundException) == sizeof(TessalException));
 
-template <class Exception>
+/// The exception is caught as its base, and a copy of it still tells its own name.
+template <class Exception, class Base>
 void expectTells(const char* name) {
     const MessageRecorder recorder;
     try {
         throw Exception("tESSAL", "../s/Some", "$Revision: 1.8 $", 42);
-    } catch (HkException& caught) {
+    } catch (Base& caught) {
         Exception copy = dynamic_cast<Exception&>(caught);
         TessalException& base = copy;
         base.generateReport();
@@ -191,16 +183,16 @@ void expectTells(const char* name) {
 
 TEST(Exceptions, TellWhatAndWhere) {
     EXPECT_THROW(origin.raise<OutOfRangeException>(), LogicException);
-    expectTells<TessalException>("TessalException");
-    expectTells<LogicException>("LogicException");
-    expectTells<OutOfRangeException>("OutOfRangeException");
-    expectTells<DataMismatchException>("DataMismatchException");
-    expectTells<InvalidArgumentException>("InvalidArgumentException");
-    expectTells<DataNotFoundException>("DataNotFoundException");
-    expectTells<StreamException>("StreamException");
-    expectTells<FileException>("FileException");
-    expectTells<ACDFileException>("ACDFileException");
-    expectTells<ACDEntryNotFoundException>("ACDEntryNotFoundException");
+    expectTells<TessalException, HkException>("TessalException");
+    expectTells<LogicException, TessalException>("LogicException");
+    expectTells<OutOfRangeException, LogicException>("OutOfRangeException");
+    expectTells<DataMismatchException, LogicException>("DataMismatchException");
+    expectTells<InvalidArgumentException, LogicException>("InvalidArgumentException");
+    expectTells<DataNotFoundException, LogicException>("DataNotFoundException");
+    expectTells<StreamException, TessalException>("StreamException");
+    expectTells<FileException, StreamException>("FileException");
+    expectTells<ACDFileException, FileException>("ACDFileException");
+    expectTells<ACDEntryNotFoundException, ACDFileException>("ACDEntryNotFoundException");
 }
 
 TEST(Exceptions, SurviveOriginsOfAnyLength) {
