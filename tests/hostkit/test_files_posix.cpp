@@ -103,6 +103,7 @@ TEST(TreeRemoval, IsNotLedAwayByALinkPutInADirectorysPlace) {
         while (!isOver) {
             ::rename(place.c_str(), (directory / "aside").c_str());
             if (::symlink((directory / "victim").c_str(), place.c_str()) == 0) {
+                std::this_thread::yield();
                 ::unlink(place.c_str());
             }
             ::rename((directory / "aside").c_str(), place.c_str());
@@ -110,6 +111,9 @@ TEST(TreeRemoval, IsNotLedAwayByALinkPutInADirectorysPlace) {
     });
     for (int i = 0; i < 150; ++i) {
         directory.make("tree/sub/below");
+        for (int sibling = 0; sibling < 30; ++sibling) {  // time between the look at an entry and its turn
+            directory.make("tree/" + std::to_string(sibling));
+        }
         HkFile::rmtree((directory / "tree").c_str());
     }
     isOver = true;
