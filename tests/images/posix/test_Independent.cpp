@@ -91,30 +91,6 @@ TEST(Independent, RecordFilesComeBackAsTheDataTheyWereMadeOf) {
     }
 }
 
-TEST(Independent, SplitPromsComeBackAsTheWhole) {
-    Workbench bench;
-    NEEDS(bench, "srec_cat");
-    bench.write("a", a);
-    for (const Format& format : formats) {
-        ASSERT_TRUE(bench.generate(std::string("-size 64K 100K 64K -disableswap -output p -format ") + format.name +
-                                   " -up 11 -data @a"));
-        std::string line = "srec_cat '('";
-        for (const char* const part : {" p_0. -offset 0", " p_1. -offset 0x10000", " p_2. -offset 0x29000"}) {
-            line.append(part).insert(line.rfind(". ") + 1, std::string(format.name) + ' ' + format.reader);
-        }
-        EXPECT_TRUE(runs(bench, line + " ')' -offset -0x11 -o back -binary && cmp back a"))
-            << format.name << ": " << bench.read("out");
-    }
-}
-
-TEST(Independent, RawFilesComeBackAsTheData) {
-    Workbench bench;
-    NEEDS(bench, "xxd");
-    bench.write("a", a);
-    ASSERT_TRUE(bench.generate("-generic -disableswap -output p -format hex -up 100 -data @a"));
-    EXPECT_TRUE(runs(bench, "xxd -r -p p.hex back && cmp back a")) << bench.read("out");
-}
-
 /// Lowest address and end of the loaded parts, as readelf tells them.
 bool rangeByReadelf(const Workbench& bench, std::uint64_t& lowest, std::uint64_t& highest) {
     lowest = ~std::uint64_t{0};
