@@ -32,59 +32,39 @@ private:
     int m_piece;
 };
 
-/// Reads the same fields from both; each is chosen by the byte before it.
-class Reader {
-public:
-    Reader(MemoryChannel& channel, DataBuffer& buffer) : m_channel(channel), m_buffer(buffer) {}
+// Each reads the same field from both; false at the end of the stream, or where a reader would give the connection up.
 
-    /// False at the end of the stream, or where a reader would give the connection up.
-    bool next() {
-        char kind = 0;
-        if (!m_channel.read(&kind, 1)) {
-            return false;
-        }
-        require(m_buffer.readByte() == kind);
-        return (kind & 3) == 0 ? number() : (kind & 3) == 1 ? truth() : text();
+bool readNumber(MemoryChannel& channel, DataBuffer& buffer) {
+    const bool isWhole = channel.left() >= 4;
+    int value = -1;
+    require(channel.readInt(&value) == 4);
+    require(value == (isWhole ? buffer.readInt() : 0));
+    return isWhole;
+}
+
+bool readTruth(MemoryChannel& channel, DataBuffer& buffer) {
+    bool value = false;
+    const bool isWhole = channel.readBool(&value);
+    require(!isWhole || value == buffer.readBool());
+    return isWhole;
+}
+
+bool readText(MemoryChannel& channel, DataBuffer& buffer) {
+    const bool isAnnounced = channel.left() >= 4;
+    int length = 0;
+    channel.readInt(&length);
+    if (!isAnnounced || length < 0 || length > longestText) {
+        return false;
     }
-
-private:
-    bool number() {
-        const bool complete = m_channel.left() >= 4;
-        int value = -1;
-        require(m_channel.readInt(&value) == 4);
-        require(value == (complete ? m_buffer.readInt() : 0));
-        return complete;
+    require(buffer.readInt() == length);
+    const bool isWhole = channel.left() >= length;
+    std::string characters(static_cast<std::size_t>(length), '\0');
+    require(channel.read(characters.data(), length) == isWhole);
+    for (int i = 0; isWhole && i < length; ++i) {
+        require(buffer.readByte() == characters[static_cast<std::size_t>(i)]);
     }
-
-    bool truth() {
-        bool value = false;
-        if (!m_channel.readBool(&value)) {
-            return false;
-        }
-        require(value == m_buffer.readBool());
-        return true;
-    }
-
-    bool text() {
-        const bool complete = m_channel.left() >= 4;
-        int length = 0;
-        m_channel.readInt(&length);
-        if (!complete || length < 0 || length > longestText) {
-            return false;
-        }
-        require(m_buffer.readInt() == length);
-        const bool isThere = m_channel.left() >= length;
-        std::string characters(static_cast<std::size_t>(length), '\0');
-        require(m_channel.read(characters.data(), length) == isThere);
-        for (int i = 0; isThere && i < length; ++i) {
-            require(m_buffer.readByte() == characters[static_cast<std::size_t>(i)]);
-        }
-        return isThere;
-    }
-
-    MemoryChannel& m_channel;
-    DataBuffer& m_buffer;
-};
+    return isWhole;
+}
 
 }  // namespace
 
@@ -95,8 +75,12 @@ void fuzz(Input input) {
     DataBuffer buffer(length);
     buffer.write(input.bytes().data(), length);
     buffer.reset();
-    Reader reader(channel, buffer);
-    while (reader.next()) {
+    bool (*const readers[])(MemoryChannel&, DataBuffer&) = {readNumber, readTruth, readText, readText};
+    for (char kind = 0; channel.read(&kind, 1);) {  // it chooses the field that follows
+        require(buffer.readByte() == kind);
+        if (!readers[kind & 3](channel, buffer)) {
+            return;
+        }
         require(buffer.getLength() == length - channel.left());
     }
 }
