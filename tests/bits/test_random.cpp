@@ -234,7 +234,7 @@ TYPED_TEST(RandomOperations, AgreeWithThePlainModel) {
     const char* const given = std::getenv("TESSAL_TEST_SEED");
     const std::string seed = given != nullptr ? given : std::to_string(std::random_device()());
     Duel<TypeParam> duel(static_cast<unsigned>(std::stoul(seed)));
-    for (int step = 0; step < 40000 && !this->HasFailure(); ++step) {
+    for (int step = 0; step < 50000 && !this->HasFailure(); ++step) {
         duel.step();
         duel.expectAgreement();
     }

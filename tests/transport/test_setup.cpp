@@ -27,7 +27,7 @@ TEST(SocketSetup, APortInUseIsRefusedAndAServerThatIsNotUpIsToldOnce) {
     EXPECT_NE(client.getClientSocketFd(), TessalSocket::noSocket) << "the socket of the last attempt";
 }
 
-/// A host whose calls fail from the n-th on.
+/// A host whose calls fail as told, and that connects at the attempt told.
 class FailingHost : public ByteByByteHost {
 public:
     bool startFails = false, openFails = false, resolveFails = false, closeFails = false;
