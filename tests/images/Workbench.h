@@ -1,38 +1,22 @@
 // A directory with data files, in which the generator runs.
 #pragma once
 
+#include <algorithm>
 #include <memory>
+#include <random>
+#include <regex>
 #include <string>
-#include <vector>
 
 #include "CommandSet.h"
 #include "MessageRecorder.h"
 #include "PromUtility.h"
 #include "TemporaryDirectory.h"
 
-/// The bytes that the hex digits stand for; blanks between them do not count.
-inline std::string bytes(const std::string& digits) {
-    std::string result;
-    int high = -1;
-    for (const char ch : digits) {
-        if (ch != ' ') {
-            const int digit = ch <= '9' ? ch - '0' : (ch & 0x5F) - 'A' + 10;
-            if (high >= 0) {
-                result += static_cast<char>(high * 16 + digit);
-            }
-            high = high >= 0 ? -1 : digit;
-        }
-    }
-    return result;
-}
-
 /// Bytes of no pattern.
 inline std::string noise(std::size_t count, unsigned seed = 1) {
+    std::minstd_rand random(seed);
     std::string result(count, '\0');
-    for (char& ch : result) {
-        seed = seed * 1664525U + 1013904223U;
-        ch = static_cast<char>(seed >> 24);
-    }
+    std::generate(result.begin(), result.end(), [&] { return static_cast<char>(random() >> 8); });
     return result;
 }
 
@@ -43,10 +27,8 @@ public:
     /// Runs "generate" with these arguments, in which "@" stands for the directory, and files in it, by default.
     bool generate(const std::string& arguments) {
         messages.clear();
-        std::string line = "generate -path " + path() + ' ';
-        for (const char ch : arguments) {
-            line += ch == '@' ? path() + '/' : std::string(1, ch);
-        }
+        const std::string line =
+            "generate -path " + path() + ' ' + std::regex_replace(arguments, std::regex("@"), path() + '/');
         const std::unique_ptr<CommandSet> command(CommandSet::string2CommandSet(line.c_str()));
         return PromUtility::generate(command.get());
     }

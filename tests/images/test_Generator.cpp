@@ -15,18 +15,15 @@
 namespace {
 
 std::vector<std::string> reports;
+std::string lastFile;
 
-/// Takes the progress of the runs while it lives.
-class ProgressWatch {
-public:
-    explicit ProgressWatch(bool (*function)(Callback&)) { ProgressInterfaceClass::setCallbackFunction(function); }
-    ~ProgressWatch() { ProgressInterfaceClass::setCallbackFunction(nullptr); }
-    ProgressWatch(const ProgressWatch&) = delete;
-    ProgressWatch& operator=(const ProgressWatch&) = delete;
+class Generator : public testing::Test {
+protected:
+    ~Generator() override { ProgressInterfaceClass::setCallbackFunction(nullptr); }
 };
 
-TEST(Generator, ReportsItsProgressBlockByBlock) {
-    const ProgressWatch watch([](Callback& record) {
+TEST_F(Generator, ReportsItsProgressBlockByBlock) {
+    ProgressInterfaceClass::setCallbackFunction([](Callback& record) {
         reports.push_back(std::to_string(record.getProgressStatus()) + ' ' + std::to_string(record.getCurrentCount()) +
                           '/' + std::to_string(record.getTotalCount()));
         return true;
@@ -46,17 +43,14 @@ TEST(Generator, ReportsItsProgressBlockByBlock) {
 }
 
 /// The last file is opened and written before a directory takes its place, so only its renaming fails.
-TEST(Generator, AReplacementThatFailsMidwayBringsTheFirstFilesBack) {
-    static std::string lastFile;
+TEST_F(Generator, AReplacementThatFailsMidwayBringsTheFirstFilesBack) {
     Workbench bench;
     lastFile = bench / "p_2.bin";
     bench.write("a", noise(900000));
     bench.write("p_0.bin", "old");
-    {
-        const ProgressWatch watch(
-            [](Callback& record) { return record.getCurrentCount() == 5 && HkFile::mkdir(lastFile.c_str(), false); });
-        EXPECT_FALSE(bench.generate("-output p -format bin -size 300000 300000 300000 -data @a"));
-    }
+    ProgressInterfaceClass::setCallbackFunction(
+        [](Callback& record) { return record.getCurrentCount() == 5 && HkFile::mkdir(lastFile.c_str(), false); });
+    EXPECT_FALSE(bench.generate("-output p -format bin -size 300000 300000 300000 -data @a"));
     EXPECT_THAT(bench.said(), testing::HasSubstr("p_2.bin: cannot be replaced: "));
     EXPECT_EQ(bench.read("p_0.bin"), "old");
     HkFile::rmdir(lastFile.c_str());
@@ -64,12 +58,12 @@ TEST(Generator, AReplacementThatFailsMidwayBringsTheFirstFilesBack) {
     EXPECT_EQ(std::distance(begin(entries), end(entries)), 2) << "no new file and nothing beside";
 }
 
-TEST(Generator, WithoutACommandThereIsNothingToDo) {
+TEST_F(Generator, WithoutACommandThereIsNothingToDo) {
     EXPECT_EQ(IF_IMAGEGEN(nullptr).makeprom(), 1);
     EXPECT_FALSE(PromUtility::generate(nullptr));
 }
 
-TEST(GeneratorFormat, IsThatOfTheShippedCommandAndTakesWhatTheOptionRowsMake) {
+TEST_F(Generator, HasTheFormatOfTheShippedCommandAndTakesWhatTheOptionRowsMake) {
     DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
     TessalCmdargs::createCommandMap();
     EXPECT_STREQ(TessalCmdargs::findFormatString("generate"), IF_IMAGEGEN::getcmdformat());

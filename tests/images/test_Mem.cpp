@@ -2,6 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <iomanip>
+#include <iterator>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -14,30 +17,29 @@ namespace {
 using ImageTools::MemOptions;
 
 /// "address:bytes" for each segment, or the first problem behind "!".
-std::string parsed(const std::string& text, const MemOptions& options = {}) {
+std::string parsed(const std::string& text, const MemOptions& options) {
     std::vector<unsigned char> bytes(text.size() / 2 + 1);
     ImageTools::SegmentMap segments;
     const std::vector<std::string> problems = ImageTools::readMem(text, options, bytes.data(), segments);
     if (!problems.empty()) {
         return '!' + problems[0];
     }
-    std::string result;
+    std::ostringstream result;
+    result << std::hex << std::uppercase << std::setfill('0');
     for (const ImageTools::Segment& segment : segments.all()) {
-        char digits[24];
-        std::snprintf(digits, sizeof digits, "%llX:", static_cast<unsigned long long>(segment.address));
-        result += (result.empty() ? "" : " ") + std::string(digits);
+        result << (result.tellp() > 0 ? " " : "") << segment.address << ':';
         for (std::size_t i = 0; i < segment.size; ++i) {
-            std::snprintf(digits, sizeof digits, "%02X", segment.data[i]);
-            result += digits;
+            result << std::setw(2) << static_cast<unsigned>(segment.data[i]);
         }
     }
-    return result;
+    return result.str();
 }
 
 TEST(Mem, TextsGiveTheirBytesOrTheirFirstMistake) {
     struct Case {
         const char* text;
         const char* result;
+        MemOptions options = {};
     };
     const Case cases[] = {
         {"", ""},
@@ -64,26 +66,21 @@ TEST(Mem, TextsGiveTheirBytesOrTheirFirstMistake) {
         {"_1", "!1:1: expected a word of hexadecimal digits or @, not \"_1\""},
         {"01 /* 02", "!1:4: the comment is not closed, expected */"},
         {"@1 01 @1 02", "!1:10: the data from here gives address 0x1 another byte than the data before"},
+        {"@4 01020304", "10:04030201", {true, false, false}},
+        {"@4 01020304", "4:01020304", {false, true, false}},
+        {"0x Z0", "0:0FF0", {false, false, true}},
     };
     for (const Case& c : cases) {
-        EXPECT_EQ(parsed(c.text), c.result) << c.text;
+        EXPECT_EQ(parsed(c.text, c.options), c.result) << c.text;
     }
-}
-
-TEST(Mem, ByteOrderAddressUnitAndUnknownBitsAreOptions) {
-    EXPECT_EQ(parsed("@4 01020304", {true, false, false}), "10:04030201");
-    EXPECT_EQ(parsed("@4 01020304", {false, true, false}), "4:01020304");
-    EXPECT_EQ(parsed("0x Z0", {false, false, true}), "0:0FF0");
 }
 
 TEST(Mem, MistakesAreReportedUpToALimit) {
     Workbench bench;
-    std::string text;
-    for (int i = 0; i < 100; ++i) {
-        text += "oops\n";
-    }
+    std::ostringstream text;
+    std::fill_n(std::ostream_iterator<const char*>(text), 100, "oops\n");
     M2IUtil_BramMapping::M2IUtil_Results result{};
-    const M2IUtil_Data_Utils reader(bench.write("a.mem", text).c_str(), DUMP_BY_DEFAULT, &result);
+    const M2IUtil_Data_Utils reader(bench.write("a.mem", text.str()).c_str(), DUMP_BY_DEFAULT, &result);
     EXPECT_EQ(result, M2IUtil_BramMapping::M2IUTIL_MALFORMED);
     EXPECT_EQ(bench.messages.info().size(), 20U);
     EXPECT_EQ(bench.said().substr(0, 11), "a.mem:1:1: ");
