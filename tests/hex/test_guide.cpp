@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <fstream>
 #include <iterator>
+#include <regex>
 #include <sstream>
 
 #include "BitView.h"
@@ -18,16 +19,12 @@ using Cells = std::vector<std::string>;
 /// The cells, without the blanks and back quotes around them, of the guide's table rows that begin with an example and
 /// have so many.
 std::vector<Cells> rowsOf(std::size_t cellCount) {
+    const std::regex cell("\\|[ `]*([^|]*?)[ `]*(?=\\|)");
     std::ifstream guide(TEST_DATA_DIR "/../../docs/bits.md");
     std::vector<Cells> rows;
     for (std::string line; std::getline(guide, line);) {
-        Cells cells;
-        std::istringstream row(line.rfind("| `", 0) == 0 ? line.substr(1, line.rfind('|')) : "");
-        for (std::string cell; std::getline(row, cell, '|');) {
-            const std::size_t first = std::min(cell.find_first_not_of(" `\r"), cell.size());
-            cells.push_back(cell.substr(first, cell.find_last_not_of(" `\r") + 1 - first));
-        }
-        if (cells.size() == cellCount) {
+        const Cells cells(std::sregex_token_iterator(line.begin(), line.end(), cell, 1), {});
+        if (line.rfind("| `", 0) == 0 && cells.size() == cellCount) {
             rows.push_back(cells);
         }
     }
