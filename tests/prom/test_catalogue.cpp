@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <tuple>
 #include <utility>
 #include <vector>
 
@@ -17,9 +18,8 @@ namespace {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-class Catalogue : public testing::Test {
-protected:
-    void SetUp() override { DeviceProfile::setDataPath(TEST_DATA_DIR "/prom"); }
+struct Catalogue : testing::Test {
+    Catalogue() { DeviceProfile::setDataPath(TEST_DATA_DIR "/prom"); }
 };
 
 std::vector<std::string> names(const std::vector<promPartAndSizePair>& parts) {
@@ -66,12 +66,12 @@ TEST_F(Catalogue, SizesAreLookedUpInTheirFiles) {
 
 TEST_F(Catalogue, ALayoutIsThatOfItsDevice) {
     const BrennwickInfo info("layout");
-    EXPECT_THAT((std::vector<int>{info.getFirstBitStreamAddress(false), info.getSecondBitStreamAddress(false),
-                                  info.getNumberOfDataStreams(false)}),
-                ElementsAre(16, 32, 2));
-    EXPECT_THAT((std::vector<int>{info.getFirstBitStreamAddress(true), info.getSecondBitStreamAddress(true),
-                                  info.getNumberOfDataStreams(true)}),
-                ElementsAre(48, 2147483647, 3));
+    const std::tuple<bool, int, int, int> counts[] = {{false, 16, 32, 2}, {true, 48, 2147483647, 3}};
+    for (const auto& [second, first, next, streams] : counts) {
+        EXPECT_EQ(info.getFirstBitStreamAddress(second), first);
+        EXPECT_EQ(info.getSecondBitStreamAddress(second), next);
+        EXPECT_EQ(info.getNumberOfDataStreams(second), streams);
+    }
     info.getSectorAddress(false).clear();
     EXPECT_THAT(info.getSectorAddress(false), ElementsAre(16, 32, 48));
     EXPECT_THAT(info.getSectorAddress(true), IsEmpty());
