@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <regex>
 #include <string>
 #include <tuple>
 #include <vector>
@@ -22,11 +23,7 @@ std::string printed(Call call) {
 }
 
 std::string line(const std::string& title, const std::string& storageBits) {
-    std::string text = title + "[\n  ";
-    for (const char bit : storageBits) {
-        text += {bit, ' '};
-    }
-    return text + "\n]\n\n";
+    return title + "[\n  " + std::regex_replace(storageBits, std::regex("."), "$& ") + "\n]\n\n";
 }
 
 std::string total(Register& reg) {

@@ -27,7 +27,9 @@ import textwrap
 ROOT, BUILD, SCRATCH = (pathlib.Path(argument).resolve() for argument in sys.argv[1:4])
 OPT = SCRATCH / "opt"
 FENCE = re.compile(r"^(?:<!-- suite: (?P<suites>[^>\n]*) -->\n)?```(?P<language>\w*)\n(?P<text>.*?)^```$", re.M | re.S)
-LIMIT = 600
+ENVIRONMENT = dict(os.environ, PATH=f"{BUILD / 'examples'}:{os.environ['PATH']}", TERM="dumb", LC_ALL="C.UTF-8",
+                   CMAKE_PREFIX_PATH=str(OPT))
+LIMITED = ["timeout", "600"]
 
 
 class Failure(Exception):
@@ -50,14 +52,9 @@ def blocks_of(page):
     return [Block(page, match, following) for match, following in zip(matches, matches[1:] + [None])]
 
 
-def environment():
-    tools = f"{BUILD / 'examples'}:{os.environ['PATH']}"
-    return dict(os.environ, PATH=tools, TERM="dumb", LC_ALL="C.UTF-8", CMAKE_PREFIX_PATH=str(OPT))
-
-
 def run(command, directory):
     """What a command prints; a failure when it fails."""
-    done = subprocess.run(["timeout", str(LIMIT), *command], cwd=directory, env=environment(), text=True, check=False,
+    done = subprocess.run([*LIMITED, *command], cwd=directory, env=ENVIRONMENT, text=True, check=False,
                           stdin=subprocess.DEVNULL, stdout=subprocess.PIPE, stderr=subprocess.STDOUT)
     if done.returncode != 0:
         raise Failure(f"status {done.returncode} of {command}:\n{done.stdout}")
@@ -86,31 +83,26 @@ def stripped_lines(text):
 
 def stands_in(wanted, path):
     lines = stripped_lines(path.read_text(encoding="utf-8"))
+    if path.name == "views.cpp":
+        return set(wanted) <= set(lines)
     return any(lines[i:i + len(wanted)] == wanted for i in range(len(lines)))
 
 
 def check_cpp(block):
-    wanted = stripped_lines(block.text)
-    views = stripped_lines((ROOT / "tests/debugger/views.cpp").read_text(encoding="utf-8"))
+    sources = [*(ROOT / "examples/guides").glob("*.cpp"), ROOT / "tests/debugger/views.cpp"]
     if "int main(" in block.text:
         build_program(block)
-    elif not any(stands_in(wanted, guide) for guide in (ROOT / "examples/guides").glob("*.cpp")):
-        if not all(line in views for line in wanted):
-            raise Failure("neither a program nor a part of one in examples/guides")
-
-
-def check_suites(block):
-    for suite in block.suites:
-        if not (ROOT / f"tests/suites/{suite}.sh").is_file():
-            raise Failure(f"there is no suite {suite}")
+    elif not any(stands_in(stripped_lines(block.text), source) for source in sources):
+        raise Failure("neither a program nor a part of one in examples/guides")
 
 
 def check_sh(block):
-    if block.suites:
-        check_suites(block)
-        return
-    text = block.text.replace("/opt/tessal", str(OPT)).replace("apt-get install", "apt-get install --simulate")
-    run(["bash", "-euo", "pipefail", "-c", text], ROOT)
+    for suite in block.suites:
+        if not (ROOT / f"tests/suites/{suite}.sh").is_file():
+            raise Failure(f"there is no suite {suite}")
+    if not block.suites:
+        text = block.text.replace("/opt/tessal", str(OPT)).replace("apt-get install", "apt-get install --simulate")
+        run(["bash", "-euo", "pipefail", "-c", text], ROOT)
 
 
 def check_cmake(block):
@@ -133,49 +125,34 @@ def matches(printed, wanted):
     return re.fullmatch(pattern, printed) is not None
 
 
-class Shell:
-    """One bash that takes a command after the other."""
-
-    def __init__(self, directory):
-        self.process = subprocess.Popen(["timeout", str(LIMIT), "bash"], cwd=directory, env=environment(), text=True,
-                                        stdin=subprocess.PIPE, stdout=subprocess.PIPE, stderr=subprocess.STDOUT)
-
-    def ask(self, command, wanted):
-        """What the command prints; one in the background prints as many lines as are wanted."""
-        self.process.stdin.write(f"{command}\nstatus=$?; echo =done=; (exit $status)\n")
-        self.process.stdin.flush()
-        lines, is_done, is_behind = [], False, command.endswith("&")
-        while not is_done or (is_behind and len(lines) < len(wanted)):
-            line = self.process.stdout.readline()
-            if not line:
-                break
-            if line == "=done=\n":
-                is_done = True
-            else:
-                lines.append(line)
-        return "".join(lines)
-
-    def close(self):
-        self.process.stdin.close()
-        self.process.wait()
-        self.process.stdout.close()
+def ask(shell, command, wanted):
+    """What a shell prints for the command; one in the background prints as many lines as are wanted."""
+    shell.stdin.write(f"{command}\nstatus=$?; echo =done=; (exit $status)\n")
+    shell.stdin.flush()
+    lines, is_done, is_behind = [], False, command.endswith("&")
+    while not is_done or (is_behind and len(lines) < len(wanted)):
+        line = shell.stdout.readline()
+        if not line:
+            break
+        if line == "=done=\n":
+            is_done = True
+        else:
+            lines.append(line)
+    return "".join(lines)
 
 
 def check_console(block):
-    session = [(part.split("\n", 1)[0], part.split("\n", 1)[1].splitlines())
-               for part in re.split(r"^\$ ", block.text, flags=re.M)[1:]]
+    session = [part.splitlines() for part in re.split(r"^\$ ", block.text, flags=re.M)[1:]]
     if not session:
         raise Failure("no command behind $")
-    shell = Shell(fresh_folder(block))
-    try:
-        for command, wanted in session:
+    with subprocess.Popen([*LIMITED, "bash"], cwd=fresh_folder(block), env=ENVIRONMENT, text=True,
+                          stdin=subprocess.PIPE, stdout=subprocess.PIPE, stderr=subprocess.STDOUT) as shell:
+        for command, *wanted in session:
             while wanted and command.endswith("\\"):
                 command += "\n" + wanted.pop(0)
-            printed = shell.ask(command, wanted)
+            printed = ask(shell, command, wanted)
             if not matches(printed, wanted):
                 raise Failure(f"$ {command}\nprints\n{printed}")
-    finally:
-        shell.close()
 
 
 def check_read_by_test(block):
