@@ -1,5 +1,4 @@
-// Paths of any form against the rules of their front, followed from one separator to the next.
-#include <algorithm>
+// Paths of any form against the state table of the front, walked character by character.
 #include <optional>
 #include <string>
 
@@ -13,33 +12,33 @@ bool isSeparator(char ch) {
     return ch == '/' || ch == '\\';
 }
 
-/// The root without its last levels, each of which begins with a separator.
-std::string above(const std::string& root, std::size_t levels) {
+enum class State { Start, OneDot, TwoDots };
+
+/// The expected result, or nothing for an illegal path.
+std::optional<std::string> convertBySteps(const std::string& path, const std::string& root) {
+    State state = State::Start;
+    int levels = 0;
+    std::size_t i = 0;
+    for (; i < path.size() && !(state == State::Start && path[i] != '.' && !isSeparator(path[i])); ++i) {
+        if (path[i] == '.') {
+            if (state == State::TwoDots) {
+                return std::nullopt;
+            }
+            state = state == State::Start ? State::OneDot : State::TwoDots;
+        } else if (isSeparator(path[i])) {
+            levels += state == State::TwoDots ? 1 : 0;
+            state = State::Start;
+        } else {
+            return std::nullopt;
+        }
+    }
     std::size_t end = root.size();
     for (std::size_t at = root.size(); levels > 0 && at-- > 0;) {
         if (isSeparator(root[at]) && --levels == 0) {
             end = at;
         }
     }
-    return root.substr(0, end);
-}
-
-/// The expected result, or nothing for an illegal path.
-std::optional<std::string> convertBySteps(const std::string& path, const std::string& root) {
-    std::size_t levels = 0;
-    for (std::size_t at = 0;;) {
-        const std::size_t end = std::min(path.find_first_not_of('.', at), path.size());
-        const std::size_t dots = end - at;
-        const bool isStep = end < path.size() && isSeparator(path[end]);
-        if (dots > 2 || (dots > 0 && !isStep && end < path.size())) {
-            return std::nullopt;
-        }
-        if (!isStep) {
-            return above(root, levels) + "/" + path.substr(end);
-        }
-        levels += dots == 2 ? 1 : 0;
-        at = end + 1;
-    }
+    return root.substr(0, end) + "/" + path.substr(i);
 }
 
 }  // namespace
