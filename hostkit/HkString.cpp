@@ -35,16 +35,18 @@ void copyShort(char* to, const char* from, std::size_t length) {
         std::memcpy(to, head, size);
         std::memcpy(to + length - size, tail, size);
     };
-    if (length >= 16) {
-        copyEnds(std::integral_constant<std::size_t, 16>());
-    } else if (length >= 8) {
+    if (length < 8) {
+        if (length >= 4) {
+            copyEnds(std::integral_constant<std::size_t, 4>());
+        } else if (length >= 2) {
+            copyEnds(std::integral_constant<std::size_t, 2>());
+        } else {
+            *to = *from;
+        }
+    } else if (length < 16) {
         copyEnds(std::integral_constant<std::size_t, 8>());
-    } else if (length >= 4) {
-        copyEnds(std::integral_constant<std::size_t, 4>());
-    } else if (length >= 2) {
-        copyEnds(std::integral_constant<std::size_t, 2>());
     } else {
-        *to = *from;
+        copyEnds(std::integral_constant<std::size_t, 16>());
     }
 }
 
@@ -78,41 +80,42 @@ std::uint32_t indexOrNone(std::size_t index) {
 // A short text has a small block of its own, which costs less to copy than a count shared by threads; a long text is
 // shared and counted. Which of both it is shows in its capacity.
 
-HkString::EmptyText HkString::s_empty{{{0}, 0, 0, 0}, ""};
+HkString::EmptyText HkString::s_empty{{{0}, 0, {0}, 0}, ""};
 
 /// A text of one owner whose content and length are not yet set.
 char* HkString::newBlock(std::size_t capacity) {
-    if (capacity <= smallCapacity) {
-        return shortTextIn(SmallBlocks::take());
-    }
+    return capacity <= smallCapacity ? shortTextIn(SmallBlocks::take()) : newLongBlock(capacity);
+}
+
+char* HkString::newLongBlock(std::size_t capacity) {
     if (capacity >= npos) {
         throw std::length_error("HkString: the text would be too long");
     }
     void* const memory = ::operator new(headSize + capacity + 1);
-    return reinterpret_cast<char*>(new (memory) Head{{1}, static_cast<std::uint32_t>(capacity), 0, 0} + 1);
+    const auto room = static_cast<std::uint32_t>(capacity);
+    return reinterpret_cast<char*>(new (memory) Head{{1}, room, {room}, 0} + 1);
 }
 
 char* HkString::shortTextIn(void* block) noexcept {
     static_assert(sizeof(Head) == headSize && offsetof(Head, length) == 12, "the length word is next to the text");
-    return reinterpret_cast<char*>(new (block) Head{{1}, smallCapacity, 0, 0} + 1);
+    return reinterpret_cast<char*>(new (block) Head{{1}, smallCapacity, {smallCapacity}, 0} + 1);
 }
 
 char* HkString::newText(std::string_view content) {
+    if (content.size() > smallCapacity) {
+        return newLongText(content);
+    }
     if (content.empty()) {
         return emptyText();
     }
-    void* const block = content.size() <= smallCapacity ? SmallBlocks::takeSpare() : nullptr;
-    if (block == nullptr) {
-        return newTextByHeap(content);
-    }
-    char* const text = shortTextIn(block);
+    char* const text = shortTextIn(SmallBlocks::take());
     copyShort(text, content.data(), content.size());
     setLength(text, content.size());
     return text;
 }
 
-char* HkString::newTextByHeap(std::string_view content) {
-    char* const text = newBlock(content.size());
+char* HkString::newLongText(std::string_view content) {
+    char* const text = newLongBlock(content.size());
     std::memcpy(text, content.data(), content.size());
     setLength(text, content.size());
     return text;
@@ -121,6 +124,7 @@ char* HkString::newTextByHeap(std::string_view content) {
 char* HkString::copiedText(char* text) {
     Head& head = headOf(text);
     if (head.capacity > smallCapacity) {
+        head.room.store(0, std::memory_order_relaxed);
         addOwner(head.owners);
         return text;
     }
@@ -140,6 +144,17 @@ void HkString::releaseBlock(char* text) noexcept {
     } else if (removeOwner(head.owners) == 0) {
         ::operator delete(&head);
     }
+}
+
+/// True when the text is this string's alone and has room for @p length bytes. What was shared and is no more has its
+/// room again.
+bool HkString::hasRoom(std::size_t length) noexcept {
+    Head& head = headOf(m_text);
+    if (length > head.capacity || head.owners.load(std::memory_order_acquire) != 1) {
+        return false;
+    }
+    head.room.store(head.capacity, std::memory_order_relaxed);
+    return true;
 }
 
 void HkString::assign(std::string_view content) {

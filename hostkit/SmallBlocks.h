@@ -48,7 +48,9 @@ private:
     static void* takeFromList();
     static void giveToList(FreeBlock* block) noexcept;
 
-    static inline thread_local Store s_store{};
+    /// A shared library calls a function to find an object of the thread, which takes longer than all that is done
+    /// here. With a fixed place among the thread's objects it need not; so small a library may be loaded late even so.
+    [[gnu::tls_model("initial-exec")]] static inline thread_local Store s_store{};
 };
 
 }  // namespace HostKit

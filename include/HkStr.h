@@ -57,10 +57,11 @@ public:
     /// True when the first @p n bytes of both are the same; bytes, not letters, and no null. A short text costs no
     /// call.
     static bool AreSame(const char* a, const char* b, std::size_t n) {
-        if (n < sizeof(std::uint32_t) || n > 2 * sizeof(std::uint64_t)) {
-            return std::memcmp(a, b, n) == 0;
+        if (n <= 2 * sizeof(std::uint64_t) && n >= sizeof(std::uint32_t)) {
+            return n >= sizeof(std::uint64_t) ? HaveSameEnds<std::uint64_t>(a, b, n)
+                                              : HaveSameEnds<std::uint32_t>(a, b, n);
         }
-        return n < sizeof(std::uint64_t) ? HaveSameEnds<std::uint32_t>(a, b, n) : HaveSameEnds<std::uint64_t>(a, b, n);
+        return std::memcmp(a, b, n) == 0;
     }
 
     /// The ASCII letter in lower or upper case, any other character unchanged.

@@ -60,12 +60,13 @@ public:
         return *this;
     }
     HkString& operator+=(char ch) {
+        char* const text = m_text;
         const std::size_t length = Length();
-        if (hasRoom(length + 1)) {
-            m_text[length] = ch;
-            setLength(m_text, length + 1);
+        if (length < headOf(text).room.load(std::memory_order_relaxed)) {
+            text[length] = ch;
+            setLength(text, length + 1);
         } else {
-            appendToNewBlock({&ch, 1});
+            append({&ch, 1});
         }
         return *this;
     }
@@ -101,7 +102,7 @@ private:
     struct Head {
         std::atomic<std::uint32_t> owners;  ///< strings that share the text
         std::uint32_t capacity;             ///< bytes that the text has room for, without the terminator
-        std::uint32_t unused;
+        std::atomic<std::uint32_t> room;    ///< the capacity, or 0 since the text is shared
         std::uint32_t length;
     };
     /// The text of every string that is empty from its start: never counted, written or released. It is as long as
@@ -122,8 +123,9 @@ private:
     }
     static char* newBlock(std::size_t capacity);
     static char* shortTextIn(void* block) noexcept;
+    static char* newLongBlock(std::size_t capacity);
     static char* newText(std::string_view content);
-    static char* newTextByHeap(std::string_view content);
+    [[gnu::noinline]] static char* newLongText(std::string_view content);  // a short text saves no registers so
     static char* copiedText(char* text);
     static void releaseText(char* text) noexcept {
         if (text != emptyText()) {
@@ -132,11 +134,7 @@ private:
     }
     static void releaseBlock(char* text) noexcept;
 
-    /// True when the text is this string's alone and has room for @p length bytes.
-    bool hasRoom(std::size_t length) const noexcept {
-        const Head& head = headOf(m_text);
-        return length <= head.capacity && head.owners.load(std::memory_order_acquire) == 1;
-    }
+    bool hasRoom(std::size_t length) noexcept;
     void assign(std::string_view content);
     void append(std::string_view content);
     void appendToNewBlock(std::string_view content);
