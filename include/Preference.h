@@ -11,24 +11,17 @@
 // clang-format off
 /// The rows of the shipped preference table, in the order of the data file:
 ///
-/// - PROMPT: whether the batch prompt asks before it erases or overwrites
-/// - LOGGING_LEVEL: 0 errors only to 3 everything
-/// - CABLE_AUTO_CONNECT: whether an operation connects the default cable by itself
-/// - CONCURRENT_MODE: whether devices of one chain are programmed at the same time
-/// - VERIFY_AFTER_PROGRAM: whether a program operation verifies behind itself
-/// - ERASE_BEFORE_PROGRAM: whether a program operation erases first
+/// - CABLE_AUTO_CONNECT: whether an operation without a cable reaches the device that the environment names
+/// - VERIFY_AFTER_PROGRAM: whether a program operation verifies behind itself, without being told
+/// - ERASE_BEFORE_PROGRAM: whether a program operation erases first, without being told
 /// - DEFAULT_CABLE: generic port name of the cable to use
-/// - DEFAULT_SPEED: cable speed in hertz
-/// - FILE_OVERWRITE: whether a file that exists is replaced
+/// - DEFAULT_SPEED: cable speed in hertz where none is given
+/// - FILE_OVERWRITE: whether what is read back replaces a file
 /// - STOP_ON_ERROR: whether a script ends at its first bad line
 /// - COLOUR: whether the console output is coloured
 /// - PROGRESS_STYLE: how progress is shown
-/// - CHECKSUM_RADIX: in which base checksums are shown
 #define TESSAL_PREFERENCES(ROW) \
-    ROW(PROMPT) \
-    ROW(LOGGING_LEVEL) \
     ROW(CABLE_AUTO_CONNECT) \
-    ROW(CONCURRENT_MODE) \
     ROW(VERIFY_AFTER_PROGRAM) \
     ROW(ERASE_BEFORE_PROGRAM) \
     ROW(DEFAULT_CABLE) \
@@ -36,8 +29,7 @@
     ROW(FILE_OVERWRITE) \
     ROW(STOP_ON_ERROR) \
     ROW(COLOUR) \
-    ROW(PROGRESS_STYLE) \
-    ROW(CHECKSUM_RADIX)
+    ROW(PROGRESS_STYLE)
 // clang-format on
 
 /// One preference: its name, its value and its legal values.

@@ -9,6 +9,10 @@
 
 namespace {
 
+TessalPreference& preferences() {
+    return *TessalPreference::getPreferenceObject();
+}
+
 std::string chosenPort(const char* given) {
     if (HkStr::ICompare(given, "auto") != 0) {
         return given;
@@ -16,7 +20,7 @@ std::string chosenPort(const char* given) {
     const char* const device = HkEnv::GetEnv("TESSAL_DEVICE");
     return device != nullptr && DeviceAddress::read(device)
                ? device
-               : TessalPreference::getPreferenceObject()->getPreference(TessalPreference::DEFAULT_CABLE);
+               : preferences().getPreference(TessalPreference::DEFAULT_CABLE);
 }
 
 bool takePort(Session& session, const std::string& port) {
@@ -34,21 +38,18 @@ bool takePort(Session& session, const std::string& port) {
 }  // namespace
 
 bool setCable(Session& session, const HkCmdArgs& args) {
-    const char* speed = nullptr;
-    if (args.isGiven("-speed")) {
-        speed = CableInfo::getDisplaySpeedString(static_cast<int>(args.integer("-speed")));
-        if (speed == nullptr) {
-            return false;  // the message has gone out
-        }
+    const int hertz = args.isGiven("-speed") ? static_cast<int>(args.integer("-speed"))
+                                             : preferences().getPreferenceValue(TessalPreference::DEFAULT_SPEED);
+    const char* const speed = CableInfo::getDisplaySpeedString(hertz);
+    if (speed == nullptr) {
+        return false;  // the message has gone out
     }
     session.leaveCable();
     const std::string port = chosenPort(args.text("-port", 0, ""));
     if (!port.empty() && !takePort(session, port)) {
         return false;
     }
-    if (speed != nullptr) {
-        std::printf("  clock %s\n", speed);
-    }
+    std::printf("  clock %s\n", speed);
     return true;
 }
 

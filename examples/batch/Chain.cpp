@@ -2,6 +2,7 @@
 
 #include <cstdio>
 
+#include "OptionCommands.h"
 #include "Quoting.h"
 #include "Session.h"
 
@@ -11,11 +12,12 @@ std::string placeOf(int position) {
     return "position " + std::to_string(position + 1) + ": ";
 }
 
-/// The address of the device that the cable leads to or, without a cable to one, that of the environment; empty for
-/// none.
+/// The address of the device that the cable leads to or, without a cable to one and where that is preferred, that of
+/// the environment; empty for none.
 std::string deviceAddress(const Session& session) {
     const char* const given = HkEnv::GetEnv("TESSAL_DEVICE");
-    return !session.device().empty() || given == nullptr ? session.device() : given;
+    const bool isGiven = given != nullptr && isPreferred(TessalPreference::CABLE_AUTO_CONNECT);
+    return session.device().empty() && isGiven ? given : session.device();
 }
 
 }  // namespace

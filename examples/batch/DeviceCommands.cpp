@@ -78,9 +78,11 @@ bool erase(Session& session, const HkCmdArgs& args) {
 
 bool program(Session& session, const HkCmdArgs& args) {
     const DeviceOptionsMgr options = takeOptions(args);
+    const bool erases =
+        options.isOptionSet(tESSALNS::ERASE_B4_PROGRAMMING) || isPreferred(TessalPreference::ERASE_BEFORE_PROGRAM);
+    const bool verifies = options.isOptionSet(tESSALNS::VERIFY) || isPreferred(TessalPreference::VERIFY_AFTER_PROGRAM);
     return forEachImage(session, args, [&](const Prom& prom, const Bytes& image) {
-        return (!options.isOptionSet(tESSALNS::ERASE_B4_PROGRAMMING) || eraseProm(prom)) && programProm(prom, image) &&
-               (!options.isOptionSet(tESSALNS::VERIFY) || verifyProm(prom, image));
+        return (!erases || eraseProm(prom)) && programProm(prom, image) && (!verifies || verifyProm(prom, image));
     });
 }
 
@@ -99,6 +101,9 @@ bool readback(Session& session, const HkCmdArgs& args) {
         if (isTextFormat(path)) {
             return prom.fail(quotedWhereNeeded(path) +
                              " would be a binary file; generate writes other formats from one");
+        }
+        if (HkFile::exist(path.c_str()) && !isPreferred(TessalPreference::FILE_OVERWRITE)) {
+            return prom.fail(quotedWhereNeeded(path) + " is there already; preference FileOverwrite True replaces it");
         }
         Bytes image;
         const bool isAssigned = !session.assignedFile(prom.position).empty();

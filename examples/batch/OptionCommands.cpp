@@ -61,6 +61,10 @@ bool showOptions(Session&, const HkCmdArgs& args) {
     return true;
 }
 
+bool isPreferred(TessalPreference::PREFERENCE row) {
+    return TessalPreference::getPreferenceObject()->isPreferenceTrue(row);
+}
+
 bool preference(Session&, const HkCmdArgs& args) {
     TessalPreference& preferences = *TessalPreference::getPreferenceObject();
     const char* const name = args.text("name");

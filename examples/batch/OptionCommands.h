@@ -9,5 +9,7 @@ class Session;
 DeviceOptionsMgr takeOptions(const HkCmdArgs& args);
 /// The same, for an operation that is only checked.
 bool showOptions(Session& session, const HkCmdArgs& args);
+/// True where the preference is set to True.
+bool isPreferred(TessalPreference::PREFERENCE row);
 /// Lists the preferences, shows one or sets one.
 bool preference(Session& session, const HkCmdArgs& args);

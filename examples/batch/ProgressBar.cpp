@@ -32,7 +32,7 @@ Terminal terminal() {
     const char* const noColour = HkEnv::GetEnv("NO_COLOR");
     const bool isPlain = (noColour != nullptr && noColour[0] != '\0') || isPreferred(TessalPreference::COLOUR, "Never");
     Terminal result = standardOutput();
-    result.hasColours = result.hasColours && !isPlain;
+    result.hasColours = (result.hasColours && !isPlain) || isPreferred(TessalPreference::COLOUR, "Always");
     result.width = isPreferred(TessalPreference::PROGRESS_STYLE, "Lines") ? 0 : result.width;
     return result;
 }

@@ -8,6 +8,7 @@
 #include "Interruption.h"
 #include "LineSource.h"
 #include "Messages.h"
+#include "OptionCommands.h"
 #include "Session.h"
 
 namespace {
@@ -23,13 +24,17 @@ bool goesOn(const Session& session) {
     return !session.hasEnded() && !Interruption::isWanted();
 }
 
+bool endsRun(Session::Outcome outcome, bool stopOnError) {
+    return outcome == Session::Outcome::Refused && (stopOnError || isPreferred(TessalPreference::STOP_ON_ERROR));
+}
+
 Status runLines(std::istream& stream, const std::string& name, bool stopOnError) {
     Messages messages(name);
     Session session(messages, false);
     LineSource source(stream);
     std::string line;
     while (goesOn(session) && source.next(line)) {
-        if (session.take(line, source.number()) == Session::Outcome::Refused && stopOnError) {
+        if (endsRun(session.take(line, source.number()), stopOnError)) {
             break;
         }
     }
@@ -85,7 +90,7 @@ Status runPrompt(bool stopOnError) {
         std::string asked;
         if (isCompletionQuery(line, asked)) {
             std::fputs(completionsOf(asked).c_str(), stdout);
-        } else if (session.take(line, source.number()) == Session::Outcome::Refused && stopOnError) {
+        } else if (endsRun(session.take(line, source.number()), stopOnError)) {
             return LinesRefused;
         }
     }

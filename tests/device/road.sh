@@ -23,7 +23,8 @@ start_typing() {
     exec 9>typed
 }
 
-# What is programmed is what is read back; a larger PROM beside it; without an erasure old and new content mix.
+# What is programmed is what is read back; a larger PROM beside it; without an erasure old and new content mix. What
+# switches ask for can be preferred.
 normal() {
     serve
     image image.bin 1000003
@@ -45,7 +46,10 @@ assignfile -p 1 -file other.bin
 program -p 1 -v"
     asked 0 'matches expected' "$cable
 assignfile -p 1 -file other.bin
-program -p 1 -e -v
+preference EraseBeforeProgram true
+preference VerifyAfterProgram true
+preference FileOverwrite true
+program -p 1
 readback -p 1 -file back.bin"
     cmp other.bin back.bin
 }
@@ -137,7 +141,7 @@ refused() {
     image image.bin 100
     : >empty.bin
     image large.bin 2097153
-    asked 1 '17 lines: 6 checked, 0 refused as expected, 11 refused' 'program -p 1
+    asked 1 '19 lines: 7 checked, 0 refused as expected, 12 refused' 'program -p 1
 verify -p 4
 erase -p 3
 assignfile -p 1 -file absent.bin
@@ -153,7 +157,10 @@ readback -p 1
 readback -p 1 -file absent/back.bin
 checksum -p 1 -expect 1
 setcable -port auto -speed 5000001
-program -p 1 -e -v'
+program -p 1 -e -v
+preference StopOnError true
+readback -p 1 -file image.bin
+not reached'
     while read -r expected; do
         grep -q "^standard input:$expected" <<<"$printed" || fail "not told: $expected: $printed"
     done <<'EXPECTED'
@@ -168,6 +175,7 @@ program -p 1 -e -v'
 14: .*absent/back.bin cannot be written
 15: The calculated checksum (0x1fe00000) differs from the expected checksum (0x00000001)
 16: Invalid speed 5000001
+19: position 1: image.bin is there already
 EXPECTED
     nothing_stays
 }
