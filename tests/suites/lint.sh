@@ -45,7 +45,7 @@ done
 count_lines() {
     sources "$@" | xargs cat | wc -l
 }
-code=$(count_lines "${library[@]}")
+code=$(count_lines "${library[@]}" examples benchmarks)
 tests=$(count_lines tests)
-echo "$(wc -w <<<"$expected") headers; $code lines of library, $tests of tests: $((100 * tests / code)) %"
+echo "$(wc -w <<<"$expected") headers; $code lines of code, $tests of tests: $((100 * tests / code)) %"
 exit $failed
