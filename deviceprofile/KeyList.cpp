@@ -2,6 +2,8 @@
 
 #include <functional>
 
+#include "deviceprofile/LogicalLines.h"
+
 namespace DeviceProfile {
 
 /// The slot that holds the key, or the free one where it belongs.
@@ -25,19 +27,27 @@ void KeyList::grow() {
     }
 }
 
-std::uint32_t KeyList::set(const char* key, std::uint32_t line) {
+std::uint32_t KeyList::set(const char* key, std::uint32_t line, const char* open) {
     if (2 * m_count >= m_slots.size()) {
         grow();
     }
     Slot& slot = m_slots[slotOf(key)];
     const std::uint32_t formerLine = slot.line;
     m_count += formerLine == 0 ? 1 : 0;
-    slot = Slot{static_cast<std::uint32_t>(key - m_text), line};
+    const auto placeOf = [this](const char* text) { return static_cast<std::uint32_t>(text - m_text); };
+    slot = Slot{placeOf(key), line, open != nullptr ? placeOf(open) : 0};
     return formerLine;
 }
 
-const char* KeyList::find(std::string_view key) const {
-    const Slot slot = m_slots.empty() ? Slot{} : m_slots[slotOf(key)];
+const char* KeyList::find(std::string_view key) {
+    if (m_slots.empty()) {
+        return nullptr;
+    }
+    Slot& slot = m_slots[slotOf(key)];
+    if (slot.open != 0) {
+        joinPieces(m_text + slot.place + key.size() + 1, m_text + slot.open);
+        slot.open = 0;
+    }
     return slot.line != 0 ? m_text + slot.place : nullptr;
 }
 

@@ -32,7 +32,28 @@ bool goesOn(const char* begin, const char* end) {
     return begin != end && end[-1] == '\\';
 }
 
+/// Sets a zero behind the last character that is not blank, and gives its place.
+char* terminate(const char* begin, char* end) {
+    end = dropBlanks(begin, end);
+    *end = '\0';
+    return end;
+}
+
 }  // namespace
+
+char* joinPieces(char* begin, char* end) {
+    char* joined = begin;
+    for (char* position = begin; position != end;) {
+        const Piece piece = pieceAt(position, end);
+        const bool open = goesOn(piece.begin, piece.end);
+        char* const text = skipBlanks(piece.begin, piece.end);
+        const auto length = static_cast<std::size_t>(piece.end - text) - (open ? 1 : 0);
+        std::memmove(joined, text, length);
+        joined += length;
+        position = piece.next;
+    }
+    return terminate(begin, joined);
+}
 
 LogicalLines::LogicalLines(char* begin, char* end) : m_position(begin), m_end(end) {
     const bool isMarked = static_cast<std::size_t>(end - begin) >= byteOrderMarkSize &&
@@ -40,29 +61,21 @@ LogicalLines::LogicalLines(char* begin, char* end) : m_position(begin), m_end(en
     m_position += isMarked ? byteOrderMarkSize : 0;
 }
 
-void LogicalLines::joinContinuation(LogicalLine& line) {
-    // In locals, for what is written through a pointer to characters could be any member.
+void LogicalLines::findLastPiece(LogicalLine& line) {
+    // In locals, for what is read through a pointer to characters could be any member.
     char* position = m_position;
-    char* end = line.end;
     std::uint32_t number = m_number;
-    for (bool open = goesOn(line.begin, end); open;) {
-        --end;
-        if (position == m_end) {
-            line.isCutOff = true;
-            break;
-        }
+    bool open = goesOn(line.begin, line.end);
+    line.isContinued = open;
+    while (open && position != m_end) {
         const Piece piece = pieceAt(position, m_end);
         open = goesOn(piece.begin, piece.end);
-        char* const text = skipBlanks(piece.begin, piece.end);
-        const auto length = static_cast<std::size_t>(piece.end - text);
-        std::memmove(end, text, length);
-        end += length;
         position = piece.next;
         ++number;
     }
+    line.isCutOff = open;
     m_position = position;
     m_number = number;
-    line.end = end;
 }
 
 bool LogicalLines::next(LogicalLine& line) {
@@ -74,13 +87,12 @@ bool LogicalLines::next(LogicalLine& line) {
         if (begin == piece.end || *begin == '#' || *begin == ';') {
             continue;
         }
-        line = LogicalLine{begin, piece.end, nullptr, m_number, false};
+        line = LogicalLine{begin, piece.end, nullptr, m_number, false, false};
         line.equals = *begin != '[' ? find(begin, piece.end, '=') : nullptr;
         if (line.equals != nullptr) {
-            joinContinuation(line);
+            findLastPiece(line);
         }
-        line.end = dropBlanks(begin, line.end);
-        *line.end = '\0';
+        line.end = line.isContinued ? m_position : terminate(begin, line.end);
         return true;
     }
     return false;

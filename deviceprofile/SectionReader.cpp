@@ -117,7 +117,7 @@ private:
             origin.report().issueInfo("%s:%u: the file ends where the value of %s should go on.\n", m_text.name.c_str(),
                                       line.number, quote(key).c_str());
         }
-        const std::uint32_t former = m_keys.set(key, line.number);
+        const std::uint32_t former = m_keys.set(key, line.number, line.isContinued ? line.end : nullptr);
         if (former != 0 && m_reports.repeated && mayReport()) {
             origin.report().issueInfo("%s:%u: %s is set again and replaces the value of line %u.\n",
                                       m_text.name.c_str(), line.number, quote(key).c_str(), former);
@@ -126,8 +126,9 @@ private:
 
     void reportMalformed(const LogicalLine& line, const char* problem) {
         if (m_reports.malformed && mayReport()) {
+            const char* const end = line.isContinued ? joinPieces(line.begin, line.end) : line.end;
             origin.report().issueInfo("%s:%u: %s, the line is skipped: \"%s\"\n", m_text.name.c_str(), line.number,
-                                      problem, quote(textOf(line.begin, line.end)).c_str());
+                                      problem, quote(textOf(line.begin, end)).c_str());
         }
     }
 

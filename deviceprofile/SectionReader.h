@@ -14,8 +14,8 @@ struct LineReports {
     bool repeated;   ///< report keys that are set twice
 };
 
-/// Reads the whole text and gives the keys of the section. They lie in the text, which is changed: lines that go on
-/// are joined, and keys moved up to their values.
+/// Reads the whole text and gives the keys of the section. They lie in the text, which is changed: keys are moved up to
+/// their values, and later lines that go on are joined.
 KeyList readSection(FileText& text, std::string_view section, LineReports reports);
 
 /// The names of the sections of the text, in the order of their first lines. They lie in the text, which is changed.
