@@ -1,4 +1,4 @@
-# Packages by CPack: for Debian one of the library, one for developers and one of the tools; for Windows one archive.
+# Packages by CPack: for Debian one each of library, data files, headers and tools; for Windows one archive.
 #
 #     cpack --config build/package/CPackConfig.cmake -B build/package
 #
@@ -9,7 +9,7 @@ set(CPACK_PACKAGE_VENDOR "The libTessalUtility authors")
 set(CPACK_PACKAGE_CONTACT "The libTessalUtility authors <authors@tessalutility.invalid>")
 set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "${PROJECT_DESCRIPTION}")
 set(CPACK_RESOURCE_FILE_LICENSE ${PROJECT_SOURCE_DIR}/LICENSE)
-set(CPACK_COMPONENTS_ALL library development tools)
+set(CPACK_COMPONENTS_ALL library data development tools)
 if(NOT TESSAL_EXAMPLES)
     list(REMOVE_ITEM CPACK_COMPONENTS_ALL tools)
 endif()
@@ -49,13 +49,18 @@ else()
     configure_file(cmake/debian-changelog.in packaging/changelog @ONLY)
     tessal_compress(${PROJECT_BINARY_DIR}/packaging/changelog ${PROJECT_BINARY_DIR}/packaging/changelog.gz)
 
+    set(CPACK_DEBIAN_DATA_PACKAGE_ARCHITECTURE all)
+
     # The host's cache of libraries is renewed by dpkg's trigger.
     file(CONFIGURE OUTPUT packaging/triggers CONTENT "activate-noawait ldconfig\n")
     set(CPACK_DEBIAN_LIBRARY_PACKAGE_CONTROL_EXTRA ${PROJECT_BINARY_DIR}/packaging/triggers)
 
-    # The name of the library's package ends in the number of its SONAME.
-    tessal_debian_package(library libtessalutility${PROJECT_VERSION_MAJOR} libs
-                          CONTENT "The shared library and its data files.")
+    # The name of the library's package ends in the number of its SONAME, so that two of them can stand side by side.
+    # The data files, which both would read, are a package for itself.
+    tessal_debian_package(library libtessalutility${PROJECT_VERSION_MAJOR} libs CONTENT "The shared library.")
+    set(CPACK_DEBIAN_LIBRARY_PACKAGE_DEPENDS "tessalutility-data (>= ${PROJECT_VERSION})")
+    tessal_debian_package(data tessalutility-data electronics
+                          CONTENT "Data files: batch commands, preferences, parts and devices.")
     tessal_debian_package(development libtessalutility-dev libdevel DEPENDS library
                           CONTENT "Headers, and what CMake, pkg-config and debuggers need.")
     tessal_debian_package(tools tessal-tools electronics DEPENDS library

@@ -1,5 +1,5 @@
 #!/usr/bin/env bash
-# about: Debian packages of library, headers and tools, unpacked and used: CMake, pkg-config, tools, completion, pages
+# about: Debian packages of library, data, headers and tools, unpacked and used: CMake, pkg-config, tools, completion, pages
 # needs: dpkg-dev=dpkg-shlibdeps pkg-config=pkg-config man-db=man
 # limit: 600
 set -euo pipefail
@@ -23,7 +23,8 @@ expect() {
 }
 soname=$(objdump -p "$libraries/libTessalUtility.so" | sed -n 's/ *SONAME *//p')
 library=libtessalutility${soname##*.}
-expect "$(field "$library" Depends)" 'libc6 .*libstdc\+\+6'
+expect "$(field "$library" Depends)" 'tessalutility-data \(>= .*libc6 .*libstdc\+\+6'
+expect "$(field tessalutility-data Architecture)" '^all$'
 expect "$(field libtessalutility-dev Depends)" "$library \(= "
 expect "$(field tessal-tools Depends)" "$library \(= .*libc6 "
 expect "$(dpkg-deb --ctrl-tarfile "$work"/packages/"$library"_*.deb | tar -xO ./shlibs)" "libTessalUtility ${soname##*.} $library"

@@ -15,7 +15,7 @@ install_library() {
     esac
     step "library built, $1" cmake --build "$build" --parallel "$jobs" --target TessalUtility
     local component
-    for component in library development; do  # the tools, which the preset has too, are not built here
+    for component in library data development; do  # the tools, which the preset has too, are not built here
         quietly cmake --install "$build" --prefix "$installed" --component "$component"
     done
     quietly diff <(cd "$root/include" && ls) <(cd "$installed/include/TessalUtility" && ls)
