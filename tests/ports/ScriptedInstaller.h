@@ -4,22 +4,26 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <cstring>
 #include <map>
+#include <numeric>
 #include <string>
 #include <vector>
 
 #include "platform/DeviceInstaller.h"
 
 using platform::ConfigurationKind;
+using platform::DeviceClass;
 using platform::DeviceProperty;
 using platform::DeviceRecord;
+using platform::DeviceSetHandle;
 using platform::IoRange;
+using platform::Machine;
+using platform::ResourceDescriptor;
 
 struct FakeDevice {
     std::string id;
     std::map<DeviceProperty, std::string> properties;
-    std::map<ConfigurationKind, std::vector<IoRange>> configurations;
+    std::map<ConfigurationKind, std::vector<IoRange>> configurations = {};
     std::uint32_t status = 0;
     std::uint32_t problem = 0;
     std::uint32_t flags = 0;  ///< after its removal
@@ -51,34 +55,30 @@ public:
 
     /// Sets, configurations, descriptors and libraries that are open.
     int openThings() const { return m_open; }
-    bool called(const std::string& call) const { return std::count(calls.begin(), calls.end(), call) != 0; }
+    /// How often that was called.
+    std::ptrdiff_t count(const std::string& call) const { return std::count(calls.begin(), calls.end(), call); }
+    FakeDevice& add(FakeDevice device) { return devices.emplace_back(std::move(device)); }
 
     std::uint32_t lastError() override { return m_error; }
-    platform::DeviceSetHandle createSet(const platform::DeviceClass* c) override { return set("createSet", c, "", {}); }
-    platform::DeviceSetHandle createSetOnMachine(const platform::DeviceClass* c) override {
-        return set("createSetOnMachine", c, "", {});
+    DeviceSetHandle createSet(const DeviceClass* c) override { return newSet("createSet", c); }
+    DeviceSetHandle createSetOnMachine(const DeviceClass* c) override { return newSet("createSetOnMachine", c); }
+    DeviceSetHandle presentDevices(const DeviceClass* c, std::uint32_t flags, DeviceSetHandle former) override {
+        const std::string call = "presentDevices" + nameOf(c) + " " + std::to_string(flags);
+        const bool isNew = former == platform::noDeviceSet;
+        const DeviceSetHandle set = isNew ? newSet(call) : former;
+        m_members.resize(devices.size());
+        std::iota(m_members.begin(), m_members.end(), 0U);
+        return isNew || step(call + " into") ? set : platform::noDeviceSet;
     }
-    platform::DeviceSetHandle presentDevices(const platform::DeviceClass* c, std::uint32_t flags,
-                                             platform::DeviceSetHandle former) override {
-        std::vector<std::uint32_t> members;
-        for (std::uint32_t i = 0; i < devices.size(); ++i) {
-            members.push_back(i);
-        }
-        if (former == platform::noDeviceSet) {
-            return set("presentDevices", c, " " + std::to_string(flags), members);
-        }
-        m_members = members;
-        return step("presentDevices" + nameOf(c) + " " + std::to_string(flags) + " into") ? former : -1;
-    }
-    bool setDetail(platform::DeviceSetHandle, platform::Machine&) override { return step("setDetail"); }
-    bool deviceAt(platform::DeviceSetHandle, std::uint32_t index, DeviceRecord& device) override {
+    bool setDetail(DeviceSetHandle, Machine&) override { return step("setDetail"); }
+    bool deviceAt(DeviceSetHandle, std::uint32_t index, DeviceRecord& device) override {
         if (index >= (isEndless ? lastDevice : m_members.size())) {
             return false;
         }
         device.node = m_members[index % m_members.size()];
         return true;
     }
-    void openDevice(platform::DeviceSetHandle, const char* id) override {
+    void openDevice(DeviceSetHandle, const char* id) override {
         step(std::string("openDevice ") + id);
         for (std::uint32_t i = 0; i < devices.size(); ++i) {
             if (devices[i].id == id) {
@@ -86,65 +86,57 @@ public:
             }
         }
     }
-    void destroySet(platform::DeviceSetHandle) override { --m_open; }
+    void destroySet(DeviceSetHandle) override { --m_open; }
 
-    bool property(platform::DeviceSetHandle, const DeviceRecord& device, DeviceProperty property, std::uint32_t& type,
+    bool property(DeviceSetHandle, const DeviceRecord& device, DeviceProperty property, std::uint32_t& type,
                   char* buffer, std::uint32_t size, std::uint32_t& needed) override {
+        const auto& properties = devices[device.node].properties;
+        const auto found = properties.find(property);
         if (!step("property " + std::to_string(static_cast<int>(property)))) {
             return false;
         }
-        const auto& properties = devices[device.node].properties;
-        const auto found = properties.find(property);
         if (found == properties.end()) {
             m_error = 13;
             return false;
         }
         const bool isList = property == DeviceProperty::HardwareIds || property == DeviceProperty::CompatibleIds;
         type = isList ? platform::listType : platform::textType;
-        std::string value = found->second;
-        needed = static_cast<std::uint32_t>(value.size()) + m_grown;
+        needed = static_cast<std::uint32_t>(found->second.size()) + m_grown;
         m_grown += growth;
         if (needed > size) {
             m_error = platform::bufferTooSmall;
             return false;
         }
-        std::memcpy(buffer, value.data(), value.size());
+        found->second.copy(buffer, size);
         return true;
     }
-    bool instanceId(const DeviceRecord& device, char* buffer, std::uint32_t size, platform::Machine) override {
+    bool instanceId(const DeviceRecord& device, char* buffer, std::uint32_t size, Machine) override {
         devices[device.node].id.copy(buffer, size);
         return step("instanceId");
     }
-    bool status(const DeviceRecord& device, platform::Machine, std::uint32_t& status, std::uint32_t& problem) override {
+    bool status(const DeviceRecord& device, Machine, std::uint32_t& status, std::uint32_t& problem) override {
         status = devices[device.node].status;
         problem = devices[device.node].problem;
         return step("status");
     }
-    bool configuration(const DeviceRecord& device, ConfigurationKind kind, platform::Machine,
+    bool configuration(const DeviceRecord& device, ConfigurationKind kind, Machine,
                        platform::LogicalConfiguration& configuration) override {
         const auto& all = devices[device.node].configurations;
         const auto found = all.find(kind);
-        if (!step("configuration " + std::to_string(static_cast<int>(kind))) || found == all.end()) {
-            return false;
-        }
-        m_ranges = found->second;
+        const bool isThere = found != all.end();
+        m_ranges = isThere ? found->second : std::vector<IoRange>();
         configuration = firstDescriptor - 1;
-        ++m_open;
-        return true;
+        return open("configuration " + std::to_string(static_cast<int>(kind)), isThere);
     }
-    bool nextIoDescriptor(std::uintptr_t previous, platform::ResourceDescriptor& descriptor) override {
+    bool nextIoDescriptor(std::uintptr_t previous, ResourceDescriptor& descriptor) override {
         descriptor = previous + 1;
-        if (!step("nextIoDescriptor") || (!isEndless && descriptor - firstDescriptor >= m_ranges.size())) {
-            return false;
-        }
-        ++m_open;
-        return true;
+        return open("nextIoDescriptor", isEndless || descriptor - firstDescriptor < m_ranges.size());
     }
-    bool ioRange(platform::ResourceDescriptor descriptor, IoRange& range) override {
+    bool ioRange(ResourceDescriptor descriptor, IoRange& range) override {
         range = m_ranges[(descriptor - firstDescriptor) % m_ranges.size()];
         return step("ioRange");
     }
-    void freeDescriptor(platform::ResourceDescriptor) override { --m_open; }
+    void freeDescriptor(ResourceDescriptor) override { --m_open; }
     void freeConfiguration(platform::LogicalConfiguration) override { --m_open; }
 
     std::uint32_t fullPath(const char* file, char* buffer, std::uint32_t size) override {
@@ -154,42 +146,37 @@ public:
         std::string(file).copy(buffer, size);
         return pathLength;
     }
-    bool setupFileClass(const char* path, platform::DeviceClass& c, char* name, std::uint32_t size) override {
+    bool setupFileClass(const char* path, DeviceClass& c, char* name, std::uint32_t size) override {
         c = platform::cableClass;
         std::string("Cables").copy(name, size);
         return step(std::string("setupFileClass ") + path) && *path != '\0';
     }
-    bool classOfName(const char* name, platform::DeviceClass& c, std::uint32_t& count) override {
+    bool classOfName(const char* name, DeviceClass& c, std::uint32_t& count) override {
         c = platform::portsClass;
         count = classCount;
         return step(std::string("classOfName ") + name);
     }
-    bool createDevice(platform::DeviceSetHandle, const char* name, const platform::DeviceClass& c,
-                      DeviceRecord&) override {
+    bool createDevice(DeviceSetHandle, const char* name, const DeviceClass& c, DeviceRecord&) override {
         return step(std::string("createDevice ") + name + nameOf(&c));
     }
-    bool storeHardwareIds(platform::DeviceSetHandle, DeviceRecord&, const char* list, std::uint32_t bytes) override {
+    bool storeHardwareIds(DeviceSetHandle, DeviceRecord&, const char* list, std::uint32_t bytes) override {
         hardwareIds.assign(list, bytes);
         return step("storeHardwareIds");
     }
-    bool callInstaller(platform::InstallFunction function, platform::DeviceSetHandle, DeviceRecord& device) override {
+    bool callInstaller(platform::InstallFunction function, DeviceSetHandle, DeviceRecord& device) override {
         const bool isDone = step("callInstaller " + std::to_string(static_cast<int>(function)));
         if (isDone && function == platform::InstallFunction::Remove) {
             removed.push_back(devices[device.node].id);
         }
         return isDone;
     }
-    bool prepareRemoval(platform::DeviceSetHandle, DeviceRecord&) override { return step("prepareRemoval"); }
-    bool installFlags(platform::DeviceSetHandle, const DeviceRecord& device, std::uint32_t& flags) override {
+    bool prepareRemoval(DeviceSetHandle, DeviceRecord&) override { return step("prepareRemoval"); }
+    bool installFlags(DeviceSetHandle, const DeviceRecord& device, std::uint32_t& flags) override {
         flags = devices[device.node].flags;
         return step("installFlags");
     }
     platform::LibraryHandle loadLibrary(const char* file) override {
-        if (!step(std::string("loadLibrary ") + file)) {
-            return nullptr;
-        }
-        ++m_open;
-        return this;
+        return open(std::string("loadLibrary ") + file) ? this : nullptr;
     }
     platform::UpdateEntry findEntry(platform::LibraryHandle, const char* name) override {
         return step(std::string("findEntry ") + name) ? +[] {} : nullptr;
@@ -202,7 +189,7 @@ public:
 private:
     static constexpr std::uintptr_t firstDescriptor = 1000;
 
-    static std::string nameOf(const platform::DeviceClass* c) {
+    static std::string nameOf(const DeviceClass* c) {
         return c == nullptr ? "" : c->data1 == platform::portsClass.data1 ? " Ports" : " Cables";
     }
     bool step(const std::string& call) {
@@ -214,14 +201,15 @@ private:
         }
         return !fails;
     }
-    platform::DeviceSetHandle set(const char* call, const platform::DeviceClass* c, const std::string& more,
-                                  const std::vector<std::uint32_t>& members) {
-        if (!step(call + nameOf(c) + more)) {
-            return platform::noDeviceSet;
-        }
-        m_members = members;
-        ++m_open;
-        return 7;
+    bool open(const std::string& call, bool isThere = true) {
+        const bool isOpen = step(call) && isThere;
+        m_open += isOpen ? 1 : 0;
+        return isOpen;
+    }
+    /// An empty set.
+    DeviceSetHandle newSet(const std::string& call, const DeviceClass* c = nullptr) {
+        m_members.clear();
+        return open(call + nameOf(c)) ? 7 : platform::noDeviceSet;
     }
 
     std::vector<std::uint32_t> m_members;
