@@ -2,12 +2,15 @@
 #pragma once
 
 #include <algorithm>
+#include <filesystem>
+#include <map>
 #include <memory>
 #include <random>
 #include <regex>
 #include <string>
 
 #include "CommandSet.h"
+#include "M2IUtil_Data_Utils.h"
 #include "MessageRecorder.h"
 #include "PromUtility.h"
 #include "TemporaryDirectory.h"
@@ -20,6 +23,18 @@ inline std::string noise(std::size_t count, unsigned seed = 1) {
     return result;
 }
 
+/// What the reader tells of an object file or memory text.
+struct SectionRange {
+    M2IUtil_BramMapping::M2IUtil_Results result{};
+    unsigned int lowest = 1;
+    unsigned int highest = 1;
+
+    explicit SectionRange(const std::string& path) {
+        const M2IUtil_Data_Utils reader(path.c_str(), DUMP_BY_DEFAULT, &result);
+        reader.GetProgramSectionAddressRange(&lowest, &highest);
+    }
+};
+
 class Workbench : public TemporaryDirectory {
 public:
     MessageRecorder messages;
@@ -31,6 +46,16 @@ public:
             "generate -path " + path() + ' ' + std::regex_replace(arguments, std::regex("@"), path() + '/');
         const std::unique_ptr<CommandSet> command(CommandSet::string2CommandSet(line.c_str()));
         return PromUtility::generate(command.get());
+    }
+
+    /// The files by their names, and the directories.
+    std::map<std::string, std::string> content() const {
+        std::map<std::string, std::string> files;
+        for (const auto& entry : std::filesystem::directory_iterator(path())) {
+            const std::string name = entry.path().filename().string();
+            files[name] = entry.is_directory() ? "directory" : read(name);
+        }
+        return files;
     }
 
     /// All that was reported, without the directory.

@@ -2,9 +2,9 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
+#include <algorithm>
 #include <fstream>
-#include <map>
+#include <optional>
 #include <regex>
 
 #include "DataPath.h"
@@ -12,98 +12,77 @@
 
 namespace {
 
-using Files = std::vector<std::pair<std::string, std::string>>;
-
-/// A command with what it says and leaves.
-struct Step {
-    std::string command;
-    std::string said;
-    Files files;
-};
-
-/// One block: data files, or directories, and commands.
-struct Block {
-    Files files;
-    std::vector<Step> steps;
-};
-
-/// "a = 1F 2E", "a "text"" or "a/".
-std::pair<std::string, std::string> readFile(const std::string& line) {
-    std::smatch parts;
-    std::regex_match(line, parts, std::regex("(\\S+)(?: = (.*)| \"(.*)\")?"));
-    std::string content = parts[3];
-    const std::string digits = parts[2];
-    for (std::size_t at = 0; at < digits.size(); at += digits[at] == ' ' ? 1 : 2) {
-        content +=
-            digits[at] == ' ' ? "" : std::string(1, static_cast<char>(std::stoi(digits.substr(at, 2), nullptr, 16)));
-    }
-    return {parts[1], content};
-}
-
-void readLine(const std::string& line, Block& block) {
-    if (line.rfind("$ generate ", 0) == 0) {
-        block.steps.push_back({line.substr(11), {}, {}});
-    } else if (block.steps.empty()) {
-        block.files.push_back(readFile(line));
-    } else if (Step& step = block.steps.back(); line.rfind("> ", 0) == 0) {
-        step.files.emplace_back(line.substr(2), "");
-    } else {
-        (step.files.empty() ? step.said : step.files.back().second) += line + '\n';
-    }
-}
-
-std::vector<Block> readBlocks(const char* path) {
-    std::vector<Block> blocks;
-    std::ifstream document(path);
-    bool isInside = false;
-    for (std::string line; std::getline(document, line);) {
-        if (line.rfind("```", 0) == 0) {
-            isInside = line == "```prom";
-            blocks.resize(blocks.size() + (isInside ? 1 : 0));
-        } else if (isInside) {
-            readLine(line, blocks.back());
+/// One block: data files, or directories, and commands on them, each with what it says and the files that it leaves.
+class Block {
+public:
+    void readLine(const std::string& line) {
+        if (line.rfind("$ generate ", 0) == 0) {
+            runCommand();
+            m_command = std::regex_replace(line.substr(11), std::regex("-data "), "-data @");
+        } else if (m_command.empty()) {
+            makeFile(line);
+        } else if (line.rfind("> ", 0) == 0) {
+            m_files.emplace_back(line.substr(2), "");
+        } else {
+            (m_files.empty() ? m_said : m_files.back().second) += line + '\n';
         }
     }
-    return blocks;
-}
 
-std::map<std::string, std::string> contentOf(const Workbench& bench) {
-    std::map<std::string, std::string> files;
-    for (const auto& entry : std::filesystem::directory_iterator(bench.path())) {
-        const std::string name = entry.path().filename().string();
-        files[name] = entry.is_directory() ? "directory" : bench.read(name);
+    /// Runs the last command that was read, and forgets it.
+    void runCommand() {
+        SCOPED_TRACE(m_command);
+        const auto before = m_bench.content();
+        const bool isDone = m_command.empty() || m_bench.generate(m_command);
+        const std::size_t end = m_said.find("...\n");  // the rest of such a text is the host's
+        EXPECT_EQ(m_bench.said().substr(0, end), m_said.substr(0, end));
+        EXPECT_TRUE(isDone || m_bench.content() == before) << "refused, but the files are others";
+        for (const auto& [name, expected] : m_files) {
+            const std::string file = m_bench.read(name);
+            const bool isText = !file.empty() && file.back() == '\n';
+            EXPECT_EQ(file + (isText ? "" : "\n"), expected);
+        }
+        m_said.clear();
+        m_files.clear();
     }
-    return files;
-}
 
-void run(const Step& step, Workbench& bench) {
-    const auto before = contentOf(bench);
-    const bool isDone = bench.generate(std::regex_replace(step.command, std::regex("-data "), "-data @"));
-    // The rest of a text that ends in "..." is the host's.
-    const std::size_t told = std::min(step.said.size(), step.said.find("...\n"));
-    EXPECT_EQ(bench.said().substr(0, told), step.said.substr(0, told)) << step.command;
-    EXPECT_TRUE(told < step.said.size() || bench.said().size() == told) << step.command << ": " << bench.said();
-    EXPECT_TRUE(isDone || contentOf(bench) == before) << "refused, but the files are others: " << step.command;
-    for (const auto& [name, expected] : step.files) {
-        const std::string content = bench.read(name);
-        const bool isText = !content.empty() && content.back() == '\n';
-        EXPECT_EQ(content + (isText ? "" : "\n"), expected) << step.command;
+private:
+    /// From "a = 1F 2E", "a "text"" or "a/".
+    void makeFile(const std::string& line) {
+        std::smatch parts;
+        std::regex_match(line, parts, std::regex("(\\S+)(?: = (.*)| \"(.*)\")?"));
+        const std::string name = parts[1];
+        std::string digits = parts[2];
+        digits.erase(std::remove(digits.begin(), digits.end(), ' '), digits.end());
+        std::string bytes = parts[3];
+        for (std::size_t at = 0; at < digits.size(); at += 2) {
+            bytes += static_cast<char>(std::stoi(digits.substr(at, 2), nullptr, 16));
+        }
+        name.back() == '/' ? m_bench.make(name) : m_bench.write(name, bytes);
     }
-}
 
-void runDocument(const char* path, std::size_t blocks) {
+    Workbench m_bench;
+    std::string m_command;
+    std::string m_said;
+    std::vector<std::pair<std::string, std::string>> m_files;
+};
+
+void runDocument(const char* path, int blocks) {
     DeviceProfile::setDataPath(TEST_DATA_DIR "/prom");
-    const std::vector<Block> document = readBlocks(path);
-    ASSERT_EQ(document.size(), blocks);
-    for (const Block& block : document) {
-        Workbench bench;
-        for (const auto& [name, content] : block.files) {
-            name.back() == '/' ? bench.make(name) : bench.write(name, content);
-        }
-        for (const Step& step : block.steps) {
-            run(step, bench);
+    std::ifstream document(path);
+    std::optional<Block> block;
+    int count = 0;
+    for (std::string line; std::getline(document, line);) {
+        if (line == "```prom") {
+            block.emplace();
+            ++count;
+        } else if (block && line == "```") {
+            block->runCommand();
+            block.reset();
+        } else if (block) {
+            block->readLine(line);
         }
     }
+    EXPECT_EQ(count, blocks);
 }
 
 TEST(Documents, TheGuideIsTrue) {

@@ -3,7 +3,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include "M2IUtil_Data_Utils.h"
 #include "PromUtility.h"
 #include "images/ElfImage.h"
 #include "images/Workbench.h"
@@ -13,17 +12,11 @@ namespace {
 using testing::HasSubstr;
 using Mapping = M2IUtil_BramMapping;
 
-struct Range {
-    Mapping::M2IUtil_Results result;
-    unsigned int lowest = 1;
-    unsigned int highest = 1;
-};
-
-Range rangeOf(const std::string& path) {
-    Range range{};
-    const M2IUtil_Data_Utils reader(path.c_str(), DUMP_BY_DEFAULT, &range.result);
-    reader.GetProgramSectionAddressRange(&range.lowest, &range.highest);
-    return range;
+/// The small file with a change.
+std::string changed(void (*change)(ElfImage&)) {
+    ElfImage elf = ElfImage::small();
+    change(elf);
+    return elf.text();
 }
 
 void countElsewhere(ElfImage& elf) {
@@ -33,33 +26,27 @@ void countElsewhere(ElfImage& elf) {
 }
 
 TEST(Elf, RangesGoFromTheLowestAddressToBehindTheLastByte) {
-    struct Case {
+    const struct {
         const char* name;
-        ElfImage elf;
         void (*change)(ElfImage&);
         unsigned int lowest;
         unsigned int highest;
-    };
-    const ElfImage small = ElfImage::small();
-    const ElfImage large = ElfImage::large();
-    Case cases[] = {
-        {"32 bits, least significant first", small, [](ElfImage&) {}, 0x1000, 0x1012},
-        {"64 bits, most significant first", large, [](ElfImage&) {}, 0x80000000, 0x80000002},
-        {"an end at 4 GiB", large, [](ElfImage& e) { e.entries[0].paddr = 0xFFFFFFFE; }, 0xFFFFFFFE, 0},
-        {"load addresses left open", small, [](ElfImage& e) { e.entries[0].paddr = e.entries[1].paddr = 0; }, 0x1000,
+    } cases[] = {
+        {"32 bits, least significant first", [](ElfImage&) {}, 0x1000, 0x1012},
+        {"64 bits, most significant first", [](ElfImage& e) { e = ElfImage::large(); }, 0x80000000, 0x80000002},
+        {"an end at 4 GiB", [](ElfImage& e) { (e = ElfImage::large()).entries[0].paddr = 0xFFFFFFFE; }, 0xFFFFFFFE, 0},
+        {"load addresses left open", [](ElfImage& e) { e.entries[0].paddr = e.entries[1].paddr = 0; }, 0x1000,
          0x20000002},
-        {"entries of other types", small, [](ElfImage& e) { e.entries[1] = {6, 0xFFFFFFFF, 0, 0, 2, 8}; }, 0x1000,
-         0x1004},
-        {"cleared memory alone", small, [](ElfImage& e) { e.entries[0].filesz = e.entries[1].filesz = 0; }, 0, 0},
-        {"count in section header 0", small, countElsewhere, 0x1000, 0x1012},
+        {"entries of other types", [](ElfImage& e) { e.entries[1] = {6, 0xFFFFFFFF, 0, 0, 2, 8}; }, 0x1000, 0x1004},
+        {"cleared memory alone", [](ElfImage& e) { e.entries[0].filesz = e.entries[1].filesz = 0; }, 0, 0},
+        {"count in section header 0", countElsewhere, 0x1000, 0x1012},
     };
-    for (Case& c : cases) {
-        const Workbench bench;
-        c.change(c.elf);
-        const Range range = rangeOf(bench.write("a.elf", c.elf.text()));
-        EXPECT_EQ(range.result, Mapping::M2IUTIL_SUCCESS) << c.name;
-        EXPECT_EQ(range.lowest, c.lowest) << c.name;
-        EXPECT_EQ(range.highest, c.highest) << c.name;
+    for (const auto& c : cases) {
+        SCOPED_TRACE(c.name);
+        const SectionRange range(Workbench().write("a.elf", changed(c.change)));
+        EXPECT_EQ(range.result, Mapping::M2IUTIL_SUCCESS);
+        EXPECT_EQ(range.lowest, c.lowest);
+        EXPECT_EQ(range.highest, c.highest);
     }
 }
 
@@ -79,17 +66,15 @@ TEST(Elf, WhatIsWrongIsNamed) {
          [](ElfImage& e) { e.entries[1].paddr = 0xFFFFFFFF; }},
     };
     for (const auto& [message, spoil] : cases) {
-        Workbench bench;
-        ElfImage elf = ElfImage::small();
-        spoil(elf);
-        const std::string path = bench.write("a.elf", elf.text());
-        EXPECT_EQ(rangeOf(path).result, Mapping::M2IUTIL_MALFORMED) << message;
+        const Workbench bench;
+        const std::string path = bench.write("a.elf", changed(spoil));
+        EXPECT_EQ(SectionRange(path).result, Mapping::M2IUTIL_MALFORMED) << message;
         EXPECT_THAT(bench.said(), HasSubstr(message));
         EXPECT_EQ(PromUtility::getDataFileSize(path.c_str()), 0U);
     }
     const Workbench bench;
-    EXPECT_EQ(rangeOf(bench / "absent.elf").result, Mapping::M2IUTIL_UNREADABLE);
-    EXPECT_EQ(rangeOf(bench.path()).result, Mapping::M2IUTIL_UNREADABLE);
+    EXPECT_EQ(SectionRange(bench / "absent.elf").result, Mapping::M2IUTIL_UNREADABLE);
+    EXPECT_EQ(SectionRange(bench.path()).result, Mapping::M2IUTIL_UNREADABLE);
 }
 
 TEST(Elf, AFileCutShortOrOfAnotherKindIsRefused) {
@@ -98,20 +83,20 @@ TEST(Elf, AFileCutShortOrOfAnotherKindIsRefused) {
         const std::string whole = elf.text();
         ASSERT_EQ(whole.size(), 122U);
         for (std::size_t at = 0; at < whole.size(); ++at) {
-            const Range cut = rangeOf(bench.write("cut.elf", whole.substr(0, at)));
+            const SectionRange cut(bench.write("cut.elf", whole.substr(0, at)));
             EXPECT_EQ(cut.result, Mapping::M2IUTIL_MALFORMED) << at;
             EXPECT_EQ(cut.highest, 0U) << at;
         }
         for (std::size_t at = 0; at < 7; ++at) {  // the identification
-            std::string changed = whole;
-            changed[at] = static_cast<char>(~changed[at]);
-            EXPECT_EQ(rangeOf(bench.write("changed.elf", changed)).result, Mapping::M2IUTIL_MALFORMED) << at;
+            std::string other = whole;
+            other[at] = static_cast<char>(~other[at]);
+            EXPECT_EQ(SectionRange(bench.write("other.elf", other)).result, Mapping::M2IUTIL_MALFORMED) << at;
         }
     }
 }
 
 TEST(DataFileSize, IsTheSpanOfAnObjectFileAndTheSizeOfAnyOther) {
-    Workbench bench;
+    const Workbench bench;
     const std::string elf = ElfImage::small().text();
     const auto sizeOf = [](const std::string& path) { return PromUtility::getDataFileSize(path.c_str()); };
     EXPECT_EQ(PromUtility::getDataFileSize(nullptr), 0U);

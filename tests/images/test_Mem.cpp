@@ -8,7 +8,6 @@
 #include <string>
 #include <vector>
 
-#include "M2IUtil_Data_Utils.h"
 #include "images/Workbench.h"
 #include "imagetools/MemReader.h"
 
@@ -76,12 +75,10 @@ TEST(Mem, TextsGiveTheirBytesOrTheirFirstMistake) {
 }
 
 TEST(Mem, MistakesAreReportedUpToALimit) {
-    Workbench bench;
+    const Workbench bench;
     std::ostringstream text;
     std::fill_n(std::ostream_iterator<const char*>(text), 100, "oops\n");
-    M2IUtil_BramMapping::M2IUtil_Results result{};
-    const M2IUtil_Data_Utils reader(bench.write("a.mem", text.str()).c_str(), DUMP_BY_DEFAULT, &result);
-    EXPECT_EQ(result, M2IUtil_BramMapping::M2IUTIL_MALFORMED);
+    EXPECT_EQ(SectionRange(bench.write("a.mem", text.str())).result, M2IUtil_BramMapping::M2IUTIL_MALFORMED);
     EXPECT_EQ(bench.messages.info().size(), 20U);
     EXPECT_EQ(bench.said().substr(0, 11), "a.mem:1:1: ");
 }

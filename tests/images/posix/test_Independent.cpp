@@ -7,7 +7,6 @@
 #include <cstdlib>
 #include <sstream>
 
-#include "M2IUtil_Data_Utils.h"
 #include "hex/HexModel.h"
 #include "images/Workbench.h"
 
@@ -100,14 +99,10 @@ TEST(Independent, LinkedProgramsHaveTheRangeThatReadelfTells) {
             highest = std::max(highest, address + size);
         }
         compared += highest != 0 ? 1 : 0;
-        M2IUtil_BramMapping::M2IUtil_Results result{};
-        const M2IUtil_Data_Utils reader((bench / "a.elf").c_str(), DUMP_BY_DEFAULT, &result);
-        unsigned int first = 0;
-        unsigned int last = 0;
-        reader.GetProgramSectionAddressRange(&first, &last);
-        EXPECT_EQ(result, M2IUtil_BramMapping::M2IUTIL_SUCCESS) << build << ": " << bench.said();
-        EXPECT_EQ(first, lowest) << build;
-        EXPECT_EQ(last, highest) << build;
+        const SectionRange range(bench / "a.elf");
+        EXPECT_EQ(range.result, M2IUtil_BramMapping::M2IUTIL_SUCCESS) << build << ": " << bench.said();
+        EXPECT_EQ(range.lowest, lowest) << build;
+        EXPECT_EQ(range.highest, highest) << build;
     }
     EXPECT_GE(compared, 3) << bench.read("out");
 }

@@ -25,8 +25,10 @@ using platform::DeviceRecord;
 using platform::DeviceSet;
 using platform::InstallFunction;
 
-constexpr const char* hardwareId = "TESSAL\\TestPort";
-constexpr const char* friendlyName = "Tessal test port (COM7)";
+constexpr char hardwareId[] = "TESSAL\\TestPort\0";  // a list of one
+constexpr char friendlyName[] = "Tessal test port (COM7)";
+
+using Texts = std::vector<std::string>;
 
 /// Wine has neither the resource calls of the configuration manager, which end the process, nor removal parameters.
 bool isWine() {
@@ -35,17 +37,6 @@ bool isWine() {
 
 DeviceInstaller& host() {
     return *platform::realDeviceInstaller();
-}
-
-void nameFriendly(DeviceSet& set) {
-    SP_DEVINFO_DATA data{};
-    data.cbSize = sizeof data;
-    const auto handle = reinterpret_cast<HDEVINFO>(set.handle());
-    ASSERT_NE(SetupDiEnumDeviceInfo(handle, 0, &data), 0);
-    ASSERT_NE(SetupDiSetDeviceRegistryPropertyA(handle, &data, SPDRP_FRIENDLYNAME,
-                                                reinterpret_cast<const BYTE*>(friendlyName),
-                                                static_cast<DWORD>(std::string(friendlyName).size() + 1)),
-              0);
 }
 
 class RealDevices : public testing::Test {
@@ -61,18 +52,21 @@ protected:
         });
     }
     static void registerPort() {
-        DeviceSet set(host(), host().createSet(&platform::portsClass));
-        ASSERT_TRUE(set.isOpen());
+        const DeviceSet set(host(), host().createSet(&platform::portsClass));
         DeviceRecord device;
         ASSERT_TRUE(host().createDevice(set.handle(), "Ports", platform::portsClass, device));
-        const std::string list = std::string(hardwareId) + '\0' + '\0';
-        ASSERT_TRUE(
-            host().storeHardwareIds(set.handle(), device, list.data(), static_cast<std::uint32_t>(list.size())));
-        nameFriendly(set);
+        ASSERT_TRUE(host().storeHardwareIds(set.handle(), device, hardwareId, sizeof hardwareId));
+        SP_DEVINFO_DATA data{};
+        data.cbSize = sizeof data;
+        const auto handle = reinterpret_cast<HDEVINFO>(set.handle());
+        ASSERT_NE(SetupDiEnumDeviceInfo(handle, 0, &data), 0);
+        ASSERT_NE(SetupDiSetDeviceRegistryPropertyA(handle, &data, SPDRP_FRIENDLYNAME,
+                                                    reinterpret_cast<const BYTE*>(friendlyName), sizeof friendlyName),
+                  0);
         ASSERT_TRUE(host().callInstaller(InstallFunction::RegisterDevice, set.handle(), device));
     }
-    static std::vector<std::string> chosen(const std::vector<const char*>& patterns) {
-        std::vector<std::string> names;
+    static Texts chosen(const std::vector<const char*>& patterns) {
+        Texts names;
         EXPECT_EQ(enumerateDevices(host(), platform::devicesPresent, patterns,
                                    [&](const DeviceSet& set, DeviceRecord& device, std::uint32_t) {
                                        names.push_back(set.text(device, DeviceProperty::FriendlyName).value_or("-"));
@@ -84,9 +78,9 @@ protected:
 };
 
 TEST_F(RealDevices, ARegisteredPortIsFoundByItsPatterns) {
-    EXPECT_EQ(chosen({hardwareId}).size(), 0U);
+    EXPECT_EQ(chosen({hardwareId}), Texts());
     registerPort();
-    const std::vector<std::string> port{friendlyName};
+    const Texts port{friendlyName};
     for (const char* const pattern : {hardwareId, "tessal\\TEST*", "@root\\ports\\*", "*\\testport"}) {
         EXPECT_EQ(chosen({pattern}), port) << pattern;
         EXPECT_EQ(chosen({"=Ports", pattern}), port) << pattern;
@@ -109,14 +103,14 @@ TEST_F(RealDevices, ItsPropertiesAndStatusAreRead) {
     ASSERT_TRUE(set.deviceAt(0, device));
     EXPECT_EQ(set.text(device, DeviceProperty::FriendlyName), friendlyName);
     EXPECT_EQ(set.text(device, DeviceProperty::Description), std::nullopt);
-    EXPECT_EQ(set.list(device, DeviceProperty::HardwareIds), std::vector<std::string>{hardwareId});
+    EXPECT_EQ(set.list(device, DeviceProperty::HardwareIds), Texts{hardwareId});
     char buffer[4] = "";
     std::uint32_t type = 0;
     std::uint32_t needed = 0;
     EXPECT_FALSE(host().property(set.handle(), device, DeviceProperty::FriendlyName, type, buffer, 4, needed));
     EXPECT_EQ(host().lastError(), platform::bufferTooSmall);
     EXPECT_EQ(type, platform::textType);
-    EXPECT_EQ(needed, std::string(friendlyName).size() + 1);
+    EXPECT_EQ(needed, sizeof friendlyName);
     std::uint32_t status = 1;
     std::uint32_t problem = 1;
     EXPECT_TRUE(host().status(device, nullptr, status, problem));
