@@ -39,7 +39,7 @@ public:
         for (const auto& [name, expected] : m_files) {
             const std::string file = m_bench.read(name);
             const bool isText = !file.empty() && file.back() == '\n';
-            EXPECT_EQ(file + (isText ? "" : "\n"), expected);
+            EXPECT_EQ(file + (isText ? "" : "\n"), expected) << name;
         }
         m_said.clear();
         m_files.clear();

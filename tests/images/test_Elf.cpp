@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <tuple>
+
 #include "PromUtility.h"
 #include "images/ElfImage.h"
 #include "images/Workbench.h"
@@ -26,12 +28,7 @@ void countElsewhere(ElfImage& elf) {
 }
 
 TEST(Elf, RangesGoFromTheLowestAddressToBehindTheLastByte) {
-    const struct {
-        const char* name;
-        void (*change)(ElfImage&);
-        unsigned int lowest;
-        unsigned int highest;
-    } cases[] = {
+    const std::tuple<const char*, void (*)(ElfImage&), unsigned int, unsigned int> cases[] = {
         {"32 bits, least significant first", [](ElfImage&) {}, 0x1000, 0x1012},
         {"64 bits, most significant first", [](ElfImage& e) { e = ElfImage::large(); }, 0x80000000, 0x80000002},
         {"an end at 4 GiB", [](ElfImage& e) { (e = ElfImage::large()).entries[0].paddr = 0xFFFFFFFE; }, 0xFFFFFFFE, 0},
@@ -41,12 +38,11 @@ TEST(Elf, RangesGoFromTheLowestAddressToBehindTheLastByte) {
         {"cleared memory alone", [](ElfImage& e) { e.entries[0].filesz = e.entries[1].filesz = 0; }, 0, 0},
         {"count in section header 0", countElsewhere, 0x1000, 0x1012},
     };
-    for (const auto& c : cases) {
-        SCOPED_TRACE(c.name);
-        const SectionRange range(Workbench().write("a.elf", changed(c.change)));
-        EXPECT_EQ(range.result, Mapping::M2IUTIL_SUCCESS);
-        EXPECT_EQ(range.lowest, c.lowest);
-        EXPECT_EQ(range.highest, c.highest);
+    for (const auto& [name, change, lowest, highest] : cases) {
+        const SectionRange range(Workbench().write("a.elf", changed(change)));
+        EXPECT_EQ(range.result, Mapping::M2IUTIL_SUCCESS) << name;
+        EXPECT_EQ(range.lowest, lowest) << name;
+        EXPECT_EQ(range.highest, highest) << name;
     }
 }
 

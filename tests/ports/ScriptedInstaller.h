@@ -57,6 +57,10 @@ public:
     int openThings() const { return m_open; }
     /// How often that was called.
     std::ptrdiff_t count(const std::string& call) const { return std::count(calls.begin(), calls.end(), call); }
+    /// What was called before that.
+    std::vector<std::string> callsBefore(const std::string& call) const {
+        return {calls.begin(), std::find(calls.begin(), calls.end(), call)};
+    }
     FakeDevice& add(FakeDevice device) { return devices.emplace_back(std::move(device)); }
 
     std::uint32_t lastError() override { return m_error; }

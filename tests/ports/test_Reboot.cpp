@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <string>
+#include <tuple>
 #include <vector>
 
 #include "CableDriver.h"
@@ -63,11 +64,7 @@ std::string outputOfReboot() {
 TEST(Reboot, GoesStepByStepAndEndsAtANo) {
     const std::string privilege = "SeShutdownPrivilege";
     const std::string leave = "exit 6 0";
-    const struct {
-        Texts failing;
-        std::uint32_t error;
-        Texts calls;
-    } cases[] = {
+    const std::tuple<Texts, std::uint32_t, Texts> cases[] = {
         {{first}, 0, {first}},
         {{second}, 0, {first, second}},
         {{}, 0, {first, second, "thread", privilege, "enable", leave}},
@@ -78,13 +75,13 @@ TEST(Reboot, GoesStepByStepAndEndsAtANo) {
         {{"enable"}, 0, {first, second, "thread", privilege, "enable", leave}},
         {{leave}, 0, {first, second, "thread", privilege, "enable", leave}},
     };
-    for (const auto& c : cases) {
-        SCOPED_TRACE(testing::PrintToString(c.failing));
+    for (const auto& [failing, error, calls] : cases) {
+        SCOPED_TRACE(testing::PrintToString(failing));
         ScriptedRestart host;
-        host.failing = c.failing;
-        host.error = c.error;
-        EXPECT_EQ(outputOfReboot(), c.failing == Texts{leave} ? "ExitWindowsEx Error.\n" : "");
-        EXPECT_EQ(host.calls, c.calls);
+        host.failing = failing;
+        host.error = error;
+        EXPECT_EQ(outputOfReboot(), failing == Texts{leave} ? "ExitWindowsEx Error.\n" : "");
+        EXPECT_EQ(host.calls, calls);
         EXPECT_EQ(host.openTokens, 0);
     }
 }

@@ -69,11 +69,4 @@ TEST(KernelPorts, StrangeTreesDoNoHarm) {
     EXPECT_EQ(portsOf("/no such directory"), Texts());
 }
 
-TEST(KernelPorts, OfThisHostAreNamedByTheirNodes) {
-    for (const std::string& text : portsOf("")) {
-        const bool isNamed = text.find("(COM") != std::string::npos || text.find("(LPT") != std::string::npos;
-        EXPECT_TRUE(isNamed && text.find("/dev/") != std::string::npos) << text;
-    }
-}
-
 }  // namespace
