@@ -54,6 +54,7 @@ TEST(DeviceIdPattern, Matches) {
         {"USB\\VID_1234", "USB\\VID_12", false},
         {"ABCDE", "A*E", true},
         {"ABCDE", "A*F", false},
+        {"AB", "AB*B", false},
         {"ABCDE", "B*", false},
         {"A*B", "'a*b", true},
         {"AXB", "'A*B", false},
