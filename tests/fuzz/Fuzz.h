@@ -1,7 +1,6 @@
 // What the fuzz targets share: each defines fuzz(), which runs once for each input.
 #pragma once
 
-#include <cstdint>
 #include <cstdlib>
 #include <string>
 #include <string_view>
@@ -9,7 +8,7 @@
 /// The bytes of an input, taken from its front.
 class Input {
 public:
-    Input(const std::uint8_t* data, std::size_t size) : m_left(reinterpret_cast<const char*>(data), size) {}
+    explicit Input(std::string_view bytes) : m_left(bytes) {}
 
     bool isEmpty() const { return m_left.empty(); }
     /// The next byte; 0 behind the end.

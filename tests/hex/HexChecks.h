@@ -1,4 +1,4 @@
-// What the conversions make of any data, compared with the model; the tests and the fuzz targets bring the data.
+// What the conversions make of any data, compared with the model; the tests and the fuzz targets bring the input.
 #pragma once
 
 #include <memory>
@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "Hex2Bit.h"
+#include "fuzz/Fuzz.h"
 #include "hex/HexModel.h"
 
 namespace HexChecks {
@@ -17,27 +18,27 @@ inline std::string taken(const char* text) {
     return text != nullptr ? text : "(null)";
 }
 
-struct Load {
-    std::string_view text;
-    std::size_t length;
-    int places;
-    Numbering numbering;
-    bool fill;
-    bool descending;
-    bool byteSwap;
-};
-
-/// The text as hex digits, as binary digits up to its first zero character, and as plain characters.
-inline bool loadAgrees(const Load& load) {
-    HexModel::NumberedVec hex(load.length, load.numbering, load.fill);
-    HexModel::NumberedVec binary(load.length, load.numbering, load.fill);
-    Model hexModel = HexModel::modelOf(hex, load.numbering);
+/// The text as hex digits, as binary digits up to its first zero character, and as plain characters. The input's first
+/// bytes tell how and where to, the others are the text.
+inline bool loadAgrees(Input input) {
+    const unsigned flags = input.byte();
+    const bool descending = (flags & 1U) != 0;
+    const bool byteSwap = (flags & 2U) != 0;
+    const bool fill = (flags & 4U) != 0;
+    const Numbering numbering = HexModel::numberings[(flags >> 3) % 3];
+    Hex2Bit::setInitValue((flags & 0x20U) != 0);
+    const unsigned lowPlaces = input.byte();
+    const auto places = static_cast<int>(lowPlaces | (input.byte() & 0x7FU) << 8);
+    const std::size_t length = static_cast<std::size_t>(places) + input.byte() % 70;
+    HexModel::NumberedVec hex(length, numbering, fill);
+    HexModel::NumberedVec binary(length, numbering, fill);
+    Model hexModel = HexModel::modelOf(hex, numbering);
     Model binaryModel = hexModel;
-    const std::string text(load.text);
-    Hex2Bit::convertHexString2BitVec(&hex, load.text, load.places, load.descending, load.byteSwap, false);
-    HexModel::loadHex(hexModel, text, load.places, load.descending, load.byteSwap);
-    Hex2Bit::convertBinString2BitVec(&binary, text.c_str(), load.places, load.descending);
-    HexModel::loadBinary(binaryModel, text.c_str(), load.places, load.descending);
+    const std::string text(input.bytes());
+    Hex2Bit::convertHexString2BitVec(&hex, input.bytes(), places, descending, byteSwap, false);
+    HexModel::loadHex(hexModel, text, places, descending, byteSwap);
+    Hex2Bit::convertBinString2BitVec(&binary, text.c_str(), places, descending);
+    HexModel::loadBinary(binaryModel, text.c_str(), places, descending);
 
     std::string digits;
     for (const char character : text) {
@@ -46,8 +47,8 @@ inline bool loadAgrees(const Load& load) {
         digits += printed;
     }
     Model plain = HexModel::modelOf(RLBitVec(4 * digits.size(), Hex2Bit::m_initValue));
-    HexModel::loadHex(plain, digits, static_cast<int>(4 * digits.size()), load.descending, load.byteSwap);
-    const auto vector = Hex2Bit::convertString2BitVec(load.text, load.descending, load.byteSwap);
+    HexModel::loadHex(plain, digits, static_cast<int>(4 * digits.size()), descending, byteSwap);
+    const auto vector = Hex2Bit::convertString2BitVec(input.bytes(), descending, byteSwap);
     return HexModel::arrayOf(hex) == hexModel.bytes && HexModel::arrayOf(binary) == binaryModel.bytes &&
            HexModel::arrayOf(*vector) == plain.bytes;
 }
@@ -91,6 +92,43 @@ inline bool vectorAgrees(const RLBitVec& vector, Numbering numbering, std::size_
     const bool agrees = Hex2Bit::convertBitVec2String(&vector, out.data(), stop) == result && out.data() == expected;
     return agrees && taken(Hex2Bit::getHexStringByHexAddress(&vector, static_cast<int>(address), digits, 1)) ==
                          (address < vector.length() ? HexModel::hexAt(model, address, digits) : "(null)");
+}
+
+/// A number into the vector, taken without a sign and with one, counted from either end.
+inline bool numberAgrees(RLBitVec& vector, Numbering numbering, std::uint32_t value) {
+    const HexModel::NumberedVec filled(vector.length(), numbering, Hex2Bit::m_initValue);
+    bool agrees = true;
+    for (const bool fromIndexZero : {false, true}) {
+        for (const bool isSigned : {false, true}) {
+            const auto number = static_cast<int>(value);
+            isSigned ? Hex2Bit::convertInt2BitVec(number, 9, &vector, fromIndexZero)
+                     : Hex2Bit::convertInt2BitVec(value, 9, &vector, fromIndexZero);
+            Model model = HexModel::modelOf(filled, numbering);
+            HexModel::writeNumber(model, isSigned && number < 0 ? 0 : value, fromIndexZero);
+            agrees = agrees && HexModel::arrayOf(vector) == model.bytes;
+        }
+    }
+    return agrees;
+}
+
+/// All of these on the input's bytes behind the first ones, which tell how.
+inline bool readingAgrees(Input input) {
+    const unsigned flags = input.byte();
+    const unsigned address = input.byte();
+    const unsigned digits = input.byte() / 2 * 2;
+    const unsigned count = input.byte();
+    const auto* const bytes = reinterpret_cast<const unsigned char*>(input.bytes().data());
+    const std::size_t length = 8 * input.bytes().size() - (input.isEmpty() ? 0 : flags % 8);
+    const Numbering numbering = HexModel::numberings[(flags >> 3) % 3];
+    Hex2Bit::setInitValue((flags & 0x20U) != 0);
+    HexModel::NumberedVec vector(length, numbering);
+    for (std::size_t i = 0; i < length; ++i) {
+        (bytes[i / 8] >> i % 8 & 1) != 0 ? vector.setBit(i) : void();
+    }
+    const std::uint32_t value = (address << 24 | digits << 16 | count << 8 | flags) >> count % 32;
+    return bytesAgree(bytes, static_cast<int>(length)) && textAgrees(input.text(), static_cast<int>(count)) &&
+           vectorAgrees(vector, numbering, address, static_cast<int>(digits), flags >= 128) &&
+           numberAgrees(vector, numbering, value);
 }
 
 }  // namespace HexChecks

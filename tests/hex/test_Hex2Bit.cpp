@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <random>
+#include <tuple>
 
 #include "BitView.h"
 #include "MessageRecorder.h"
@@ -37,15 +38,14 @@ std::unique_ptr<RLBitVec> vectorOf(const std::string& hex) {
 class Hex2BitRandom : public Hex2BitTest {
 protected:
     std::size_t below(std::size_t limit) { return m_random() % limit; }
-    bool coin() { return below(2) != 0; }
-    Bytes bytes(std::size_t count) {
-        Bytes bytes(count);
-        std::generate(bytes.begin(), bytes.end(), [this] { return static_cast<unsigned char>(m_random()); });
+    std::string bytes(std::size_t count) {
+        std::string bytes(count, '\0');
+        std::generate(bytes.begin(), bytes.end(), [this] { return static_cast<char>(m_random()); });
         return bytes;
     }
     std::string text(std::size_t length) {
-        const std::string_view alphabet = coin() ? "0123456789abcdefABCDEF" : "01";
-        const std::size_t foreignPercent = coin() ? 10 : 0;
+        const std::string_view alphabet = below(2) != 0 ? "0123456789abcdefABCDEF" : "01";
+        const std::size_t foreignPercent = 10 * below(2);
         std::string result(length, ' ');
         for (char& character : result) {
             const bool isForeign = below(100) < foreignPercent;
@@ -63,29 +63,20 @@ private:
 TEST_P(Hex2BitRandom, AgreesWithTheModel) {
     const MessageRecorder silent;
     for (std::size_t round = 0; round < std::size_t{151} * 30; ++round) {
-        Hex2Bit::setInitValue(coin());
         const bool isLong = round % 151 == 0;
         const std::size_t size = isLong ? below(30000) : round % 151;
-        const auto bits = static_cast<int>(size);
-        const Numbering numbering = HexModel::numberings[coin() ? 0 : below(3)];
-        const std::string digits = text(below(isLong ? 9000 : 140));
-        const HexChecks::Load load{digits, size + (coin() ? below(70) : 0), bits, numbering, coin(), coin(), coin()};
-        ASSERT_TRUE(HexChecks::loadAgrees(load)) << digits << ", size " << size << load.descending << load.byteSwap;
-        ASSERT_TRUE(HexChecks::bytesAgree(bytes((size + 7) / 8).data(), bits)) << size << " bits";
-        ASSERT_TRUE(HexChecks::textAgrees(digits, static_cast<int>(below(160)))) << digits;
-        HexModel::NumberedVec vector(size, numbering);
-        for (std::size_t i = 0; i < size; ++i) {
-            below(4) == 0 ? vector.setBit(i) : void();
-        }
-        ASSERT_TRUE(
-            HexChecks::vectorAgrees(vector, numbering, below(size + 9), static_cast<int>(2 * below(20)), coin()))
-            << size << " bits";
+        const std::string places{static_cast<char>(size % 256), static_cast<char>(size / 256)};
+        const std::string load = bytes(1) + places + bytes(1) + text(below(isLong ? 9000 : 140));
+        ASSERT_TRUE(HexChecks::loadAgrees(Input(load))) << testing::PrintToString(load);
+        const std::string reading = bytes(4) + (below(2) != 0 ? text(below(140)) : bytes((size + 7) / 8));
+        ASSERT_TRUE(HexChecks::readingAgrees(Input(reading))) << testing::PrintToString(reading);
     }
 }
 
 TEST_P(Hex2BitRandom, ByteBuffersAreMirrored) {
     for (int count = 0; count <= 140; ++count) {
-        Bytes buffer = bytes(static_cast<std::size_t>(count));
+        const std::string random = bytes(static_cast<std::size_t>(count));
+        Bytes buffer(random.begin(), random.end());
         Bytes expected = buffer;
         std::transform(buffer.begin(), buffer.end(), expected.begin(), HexModel::mirrored);
         const std::unique_ptr<unsigned char[]> copy(Hex2Bit::reverseBufferBits(buffer.data(), count));
@@ -115,50 +106,23 @@ TEST_P(Hex2BitTest, TextsOfWhatIsMissingOrEmpty) {
 }
 
 TEST_P(Hex2BitTest, HexTextToNumbers) {
-    struct Case {
-        const char* text;
-        int digits;
-        int number;
-        int filled;  ///< with ones as the fill value
-    };
-    const Case cases[] = {
+    // The number, and the one with ones as the fill value.
+    const std::tuple<const char*, int, int, int> cases[] = {
         {"1234", 2, 0x34, 0x34}, {"12", 4, 0x1200, 0x12FF},
         {"80000001", 8, 1, 1},   {"1 2", 2, 0x20, 0x2F},  // three characters counted: the digit 1 is cut
         {"12", -3, 0, 0},        {nullptr, 2, 0, 0xFF},
     };
-    for (const Case& one : cases) {
+    for (const auto& [text, digits, number, filled] : cases) {
         for (const bool fill : {false, true}) {
             Hex2Bit::setInitValue(fill);
-            EXPECT_EQ(Hex2Bit::convertHexString2Int(one.text, one.digits), fill ? one.filled : one.number);
-            EXPECT_EQ(Hex2Bit::convertHexString2Long(one.text, one.digits), fill ? one.filled : one.number);
+            EXPECT_EQ(Hex2Bit::convertHexString2Int(text, digits), fill ? filled : number);
+            EXPECT_EQ(Hex2Bit::convertHexString2Long(text, digits), fill ? filled : number);
         }
     }
     const unsigned char bytes[] = {0x12, 0x34, 0xFF, 0xFF};
     EXPECT_EQ(Hex2Bit::convertBin2Long(bytes, 32), 0x7FFF3412);
     EXPECT_EQ(Hex2Bit::convertBin2Int(bytes, -1), 0);
     EXPECT_EQ(Hex2Bit::convertBin2Int(nullptr, 8), 0);
-}
-
-TEST_P(Hex2BitTest, NumbersIntoHeldVectorsAgreeWithTheModel) {
-    for (const Numbering numbering : HexModel::numberings) {
-        for (const std::size_t length : {0U, 1U, 4U, 8U, 31U, 32U, 33U, 70U}) {
-            for (const std::uint32_t value : {0U, 1U, 0xBU, 0xFFU, 0x12345678U, 0x7FFFFFFFU, 0x80000000U, ~0U}) {
-                for (int form = 0; form < 8; ++form) {
-                    const bool fromIndexZero = form % 2 != 0;
-                    const bool isSigned = form / 2 % 2 != 0;
-                    Hex2Bit::setInitValue(form / 4 != 0);
-                    HexModel::NumberedVec vector(length, numbering, !Hex2Bit::m_initValue);
-                    isSigned ? Hex2Bit::convertInt2BitVec(static_cast<int>(value), 9, &vector, fromIndexZero)
-                             : Hex2Bit::convertInt2BitVec(value, 9, &vector, fromIndexZero);
-                    const HexModel::NumberedVec filled(length, numbering, Hex2Bit::m_initValue);
-                    Model model = HexModel::modelOf(filled, numbering);
-                    const bool isIgnored = isSigned && value > 0x7FFFFFFF;
-                    HexModel::writeNumber(model, isIgnored ? 0 : value, fromIndexZero);
-                    ASSERT_EQ(HexModel::arrayOf(vector), model.bytes) << value << " in " << length << ", form " << form;
-                }
-            }
-        }
-    }
 }
 
 TEST_P(Hex2BitTest, NumbersIntoNewVectors) {

@@ -86,37 +86,31 @@ std::string positionsOf(std::size_t length, Numbering numbering) {
     });
 }
 
-/// The place in the text of the digit that index @p i of a load comes from: the one whose ones arrive there.
-std::size_t sourceOf(std::size_t i, std::size_t digits, bool descending, bool byteSwap) {
-    for (std::size_t place = 0; place < digits; ++place) {
-        std::string text(digits, '0');
-        text[place] = 'f';
-        const auto vector =
-            Hex2Bit::convertHexString2BitVec(text.c_str(), static_cast<int>(4 * digits), descending, byteSwap, false);
-        if (vector->testBit(i)) {
-            return place;
-        }
-    }
-    return digits;
-}
-
 TEST(BitsGuide, PicturesShowWhatTheLibraryDoes) {
     std::ostringstream table;
-    table << "what,of,values\n"
+    table << std::boolalpha << "what,of,values\n"
           << "index,LRBitVec," << positionsOf(12, Numbering::Storage) << "\nindex,RLBitVec,"
           << positionsOf(12, Numbering::Usual) << "\nindex,RLBitVec forward," << positionsOf(12, Numbering::Forward)
           << "\nindex,RLBitVec byte mirror," << positionsOf(12, Numbering::Mirrored) << "\n";
-    for (const bool descending : {false, true}) {
-        for (const bool byteSwap : {false, true}) {
-            std::ostringstream load;
-            load << std::boolalpha << ",12a5 descending " << descending << " byteSwap " << byteSwap << ",";
-            const auto vector = Hex2Bit::convertHexString2BitVec("12a5", 16, descending, byteSwap, false);
-            const auto bit = [&](std::size_t i) { return vector->testBit(i) ? 1 : 0; };
-            const auto source = [&](std::size_t i) { return sourceOf(i, 4, descending, byteSwap); };
-            table << "bit" << load.str() << ofEachIndex(16, bit) << "\ncharacter" << load.str()
-                  << ofEachIndex(16, source) << "\nposition" << load.str() << positionsOf(16, Numbering::Usual)
-                  << "\ndata" << load.str() << bytesOf(*vector) << "\n";
-        }
+    for (int form = 0; form < 4; ++form) {
+        const bool descending = form / 2 != 0;
+        const bool byteSwap = form % 2 != 0;
+        const auto load = [=](const char* text) {
+            return Hex2Bit::convertHexString2BitVec(text, 16, descending, byteSwap, false);
+        };
+        const auto vector = load("12a5");
+        const auto bit = [&](std::size_t i) { return vector->testBit(i) ? 1 : 0; };
+        // The ones of two more loads spell, in binary, the place in the text that a bit comes from.
+        const auto high = load("00ff");
+        const auto low = load("0f0f");
+        const auto source = [&](std::size_t i) { return (high->testBit(i) ? 2 : 0) + (low->testBit(i) ? 1 : 0); };
+        const auto row = [&](const char* what, const std::string& values) {
+            table << what << ",12a5 descending " << descending << " byteSwap " << byteSwap << "," << values << "\n";
+        };
+        row("bit", ofEachIndex(16, bit));
+        row("character", ofEachIndex(16, source));
+        row("position", positionsOf(16, Numbering::Usual));
+        row("data", bytesOf(*vector));
     }
     std::ifstream file(TEST_DATA_DIR "/../../docs/pictures/bits.csv");
     const std::string drawn((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
