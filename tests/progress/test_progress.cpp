@@ -18,6 +18,10 @@ namespace {
 using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::Pair;
+using Funnel = ProgressInterfaceClass;
+
+constexpr int most = std::numeric_limits<int>::max();
+constexpr int least = std::numeric_limits<int>::min();
 
 std::vector<std::pair<int, int>> calls;  // status and current count
 int now = 0;
@@ -35,109 +39,93 @@ protected:
         now = 1;
         answer = true;
         calls.clear();
-        *ProgressInterfaceClass::m_callback = CallbackFunction();
-        ProgressInterfaceClass::setCallbackFunction(record);
+        *Funnel::m_callback = CallbackFunction();
+        Funnel::setCallbackFunction(record);
     }
     ~Progress() override {
-        ProgressInterfaceClass::setCallbackFunction(nullptr);
+        Funnel::setCallbackFunction(nullptr);
         setProgressClock(nullptr);
     }
 
-    /// One update at the given percent of 100 steps; true when the function saw it.
-    static bool reaches(int percent) {
-        const std::size_t before = calls.size();
-        ProgressInterfaceClass::m_cbData->setTotalCount(100);
-        ProgressInterfaceClass::m_cbData->setCurrentCount(percent - 1);
-        ProgressInterfaceClass::updateProgress();
-        return calls.size() > before;
+    /// Whether an update at this count reaches the function.
+    static bool reaches(int total, int count) {
+        Callback progress;
+        progress.setProgressStatus(PROGRESS_UPDATE);
+        progress.setTotalCount(total);
+        progress.setCurrentCount(count);
+        return Funnel::m_callback->callFunction(progress);
     }
 };
 
 TEST_F(Progress, ReachesTheFunctionOnceForEachPercent) {
-    ProgressInterfaceClass::startProgressUpdate(1000, "working");
-    EXPECT_STREQ(ProgressInterfaceClass::getCBData()->getCallbackText(), "working");
+    Funnel::startProgressUpdate(1000, "working");
+    EXPECT_STREQ(Funnel::getCBData()->getCallbackText(), "working");
     for (int step = 0; step < 10; ++step) {
-        ProgressInterfaceClass::updateProgress();
+        Funnel::updateProgress();
     }
-    ProgressInterfaceClass::setProgressText("still");
-    ProgressInterfaceClass::setProgressText("still");
-    ProgressInterfaceClass::endProgressUpdate();
-    ProgressInterfaceClass::startProgressUpdate(1000);
-    ProgressInterfaceClass::updateProgress();
-    ProgressInterfaceClass::stopProgressUpdate();
+    Funnel::setProgressText("still");
+    Funnel::setProgressText("still");
+    Funnel::endProgressUpdate();
+    Funnel::startProgressUpdate(1000);
+    Funnel::updateProgress();
+    Funnel::stopProgressUpdate();
     EXPECT_THAT(calls, ElementsAre(Pair(PROGRESS_START, 0), Pair(PROGRESS_UPDATE, 1), Pair(PROGRESS_UPDATE, 10),
                                    Pair(PROGRESS_TEXT, 10), Pair(PROGRESS_TEXT, 10), Pair(PROGRESS_END, 1000),
                                    Pair(PROGRESS_START, 0), Pair(PROGRESS_UPDATE, 1), Pair(PROGRESS_END, 1)));
 }
 
 TEST_F(Progress, ASilenceOfMoreThanTenSecondsLetsTheSamePercentThrough) {
-    EXPECT_TRUE(reaches(5));
-    now = 500;
-    EXPECT_FALSE(reaches(5));
-    now = 500 + 10999;
-    EXPECT_FALSE(reaches(5)) << "held back, and the silence starts anew";
-    now += 11000;
-    EXPECT_TRUE(reaches(5));
-    now += 10999;
-    EXPECT_FALSE(reaches(5));
-    now -= 100000;
-    EXPECT_FALSE(reaches(5)) << "a clock that went back";
-    EXPECT_TRUE(reaches(6));
-    now = std::numeric_limits<int>::max() - 5000;
-    EXPECT_TRUE(reaches(7));
-    EXPECT_FALSE(reaches(7));
-    now = std::numeric_limits<int>::min() + 5999;
-    EXPECT_TRUE(reaches(7)) << "11000 ticks across the wrap";
-}
-
-TEST_F(Progress, GuardsStopCallsWithoutSteps) {
-    EXPECT_TRUE(ProgressInterfaceClass::startProgressUpdate(0));
-    calls.clear();
-    EXPECT_FALSE(ProgressInterfaceClass::updateProgress());
-    EXPECT_FALSE(ProgressInterfaceClass::endProgressUpdate());
-    ProgressInterfaceClass::m_cbData->setProgressStatus(PROGRESS_UPDATE);
-    EXPECT_FALSE(ProgressInterfaceClass::callCallbackFunction());
-    EXPECT_THAT(calls, IsEmpty());
-
-    ProgressInterfaceClass::startProgressUpdate(2);
-    for (bool expected : {true, true, true, false, false}) {
-        EXPECT_EQ(ProgressInterfaceClass::updateProgress(), expected);
+    // An update that is held back starts the silence anew; the clock goes back once, and in the end passes its wrap.
+    const std::tuple<int, int, bool> updates[] = {
+        {1, 5, true},           {500, 5, false},        {11499, 5, false},
+        {22499, 5, true},       {33498, 5, false},      {-66502, 5, false},
+        {-66502, 6, true},      {most - 5000, 7, true}, {most - 5000, 7, false},
+        {least + 5999, 7, true}};
+    for (const auto& [time, percent, isThrough] : updates) {
+        now = time;
+        EXPECT_EQ(reaches(100, percent), isThrough) << percent << " % at " << time;
     }
-    EXPECT_EQ(ProgressInterfaceClass::m_cbData->getCurrentCount(), 3);
 }
 
 TEST_F(Progress, PercentIsComputedIn32Bits) {
-    constexpr int least = std::numeric_limits<int>::min();
-    // Two counts of the same percent of each total.
-    const std::tuple<int, int, int> cases[] = {
-        {200, 10, 11}, {3, 2, 2}, {-1, least, least}, {1 << 30, 1 << 25, 1 << 25}};
-    for (const auto& [total, first, second] : cases) {
-        CallbackFunction filter;
-        filter.setFunction(record);
-        Callback progress;
-        progress.setProgressStatus(PROGRESS_UPDATE);
-        progress.setTotalCount(total);
-        progress.setCurrentCount(first);
-        EXPECT_TRUE(filter.callFunction(progress)) << total;
-        progress.setCurrentCount(second);
-        EXPECT_FALSE(filter.callFunction(progress)) << total;
+    // Those that are held back have the percent of the update before.
+    const std::tuple<int, int, bool> updates[] = {{200, 10, true}, {200, 11, false},  {3, 2, true},
+                                                  {3, 2, false},   {-1, least, true}, {1 << 30, 1 << 25, false}};
+    for (const auto& [total, count, isThrough] : updates) {
+        EXPECT_EQ(reaches(total, count), isThrough) << count << " of " << total;
     }
+}
+
+TEST_F(Progress, GuardsStopCallsWithoutSteps) {
+    EXPECT_TRUE(Funnel::startProgressUpdate(0));
+    calls.clear();
+    EXPECT_FALSE(Funnel::updateProgress());
+    EXPECT_FALSE(Funnel::endProgressUpdate());
+    Funnel::m_cbData->setProgressStatus(PROGRESS_UPDATE);
+    EXPECT_FALSE(Funnel::callCallbackFunction());
+    EXPECT_THAT(calls, IsEmpty());
+
+    Funnel::startProgressUpdate(2);
+    for (bool expected : {true, true, true, false, false}) {
+        EXPECT_EQ(Funnel::updateProgress(), expected);
+    }
+    EXPECT_EQ(Funnel::m_cbData->getCurrentCount(), 3);
 }
 
 TEST_F(Progress, ResultsPassThrough) {
     answer = false;
-    EXPECT_FALSE(ProgressInterfaceClass::startProgressUpdate(5));
-    ProgressInterfaceClass::setCallbackFunction(nullptr);
-    EXPECT_FALSE(ProgressInterfaceClass::startProgressUpdate(7, nullptr));
-    EXPECT_EQ(ProgressInterfaceClass::m_cbData->getTotalCount(), 7);
-    Callback* const kept = ProgressInterfaceClass::m_cbData;
-    ProgressInterfaceClass::m_cbData = nullptr;
-    EXPECT_TRUE(ProgressInterfaceClass::startProgressUpdate(5));
-    EXPECT_TRUE(ProgressInterfaceClass::updateProgress());
-    EXPECT_TRUE(ProgressInterfaceClass::setProgressText("x"));
-    EXPECT_TRUE(ProgressInterfaceClass::endProgressUpdate());
-    ProgressInterfaceClass::setTessalMode(tESSALNS::MODE_TYPE(1));
-    ProgressInterfaceClass::m_cbData = kept;
+    EXPECT_FALSE(Funnel::startProgressUpdate(5));
+    Funnel::setCallbackFunction(nullptr);
+    EXPECT_FALSE(Funnel::startProgressUpdate(7, nullptr));
+    EXPECT_EQ(Funnel::m_cbData->getTotalCount(), 7);
+    Callback* const kept = Funnel::m_cbData;
+    Funnel::m_cbData = nullptr;
+    EXPECT_TRUE(Funnel::startProgressUpdate(5));
+    EXPECT_TRUE(Funnel::updateProgress());
+    EXPECT_TRUE(Funnel::setProgressText("x"));
+    EXPECT_TRUE(Funnel::endProgressUpdate());
+    Funnel::setTessalMode(tESSALNS::MODE_TYPE(1));
+    Funnel::m_cbData = kept;
     EXPECT_EQ(kept->getMode(), 9);
     EXPECT_EQ(kept->getSubMode(), 7);
 }
