@@ -18,25 +18,23 @@ struct BareRecord : Streamable {
     void writeStream(std::ostream& out) override { Streamable::writeStream(out); }
 };
 
-/// A buffer that gives one character at a time and holds none ready.
+/// A buffer that never holds more than one character ready.
 class Trickle : public std::streambuf {
 public:
-    explicit Trickle(std::string text) : m_text(std::move(text)) {}
-
-protected:
-    int_type underflow() override { return m_next < m_text.size() ? traits_type::to_int_type(m_text[m_next]) : -1; }
-    int_type uflow() override {
-        const int_type c = underflow();
-        m_next += c == -1 ? 0 : 1;
-        return c;
-    }
+    explicit Trickle(std::string text) : m_text(std::move(text)) { setg(m_text.data(), m_text.data(), m_text.data()); }
 
 private:
+    int_type underflow() override {
+        if (gptr() == m_text.data() + m_text.size()) {
+            return traits_type::eof();
+        }
+        setg(gptr(), gptr(), gptr() + 1);
+        return traits_type::to_int_type(*gptr());
+    }
     std::string m_text;
-    std::size_t m_next = 0;
 };
 
-/// Hands the text to @p check in a stream whose buffer holds all of it ready, and in one whose buffer holds nothing.
+/// Hands the text to @p check in a stream whose buffer holds all of it ready, and in one whose buffer does not.
 template <class Check>
 void throughBothBuffers(const std::string& text, Check check) {
     std::stringbuf whole(text);
