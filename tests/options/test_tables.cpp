@@ -37,14 +37,6 @@ const std::vector<Operation<ModeOptionsMgr>> modeOperations = {
     {"generate", 4, 8, &ModeOptionsMgr::getMPMGenerateOptions, &ModeOptionsMgr::clearMPMGenerateOptions},
     {"generate", 9, 18, &ModeOptionsMgr::getPFFGenerateOptions, &ModeOptionsMgr::clearPFFGenerateOptions}};
 
-std::string shown(const std::vector<HkString>& texts) {
-    std::string result;
-    for (const HkString& text : texts) {
-        result += '[' + std::string(text) + ']';
-    }
-    return result;
-}
-
 /// The checks of one operation on the rows of its table.
 template <class Manager, class Option>
 class Table {
@@ -89,12 +81,12 @@ private:
 
     void expectRoundTrip(const Manager& manager) const {
         const std::vector<HkString> options = (manager.*m_operation.options)();
-        SCOPED_TRACE(m_operation.command + shown(options));
+        SCOPED_TRACE(m_operation.command + testing::PrintToString(options));
         std::unique_ptr<HkCmdArgs> args;
         ASSERT_NO_THROW(args = parsed(options));
         Manager back;
         OptionReader<Manager, Option>(*args, m_rows, back).read(m_operation.first, m_operation.last);
-        EXPECT_EQ(shown((back.*m_operation.options)()), shown(options));
+        EXPECT_EQ((back.*m_operation.options)(), options);
     }
 
     /// The options as the command's parser, strict, gives them back.
