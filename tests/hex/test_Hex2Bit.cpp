@@ -1,15 +1,15 @@
-// The conversions on data worked out by hand, and on random data against the model, with both widths of the kernels.
+// The conversions on data worked out by hand, and on random data against the model, with either width of the kernels.
 #include "Hex2Bit.h"
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <random>
 #include <tuple>
 
 #include "BitView.h"
 #include "MessageRecorder.h"
 #include "VectorWidth.h"
+#include "bits/Chance.h"
 #include "hex/HexChecks.h"
 
 namespace {
@@ -17,12 +17,9 @@ namespace {
 using HexChecks::taken;
 using Bytes = std::vector<unsigned char>;
 
-class Hex2BitTest : public testing::TestWithParam<bool> {
+class Hex2BitTest : public testing::Test {
 protected:
     ~Hex2BitTest() override { Hex2Bit::setInitValue(false); }
-
-private:
-    const VectorWidth m_width{GetParam()};
 };
 
 /// The bits by index, 0 first.
@@ -34,61 +31,43 @@ std::unique_ptr<RLBitVec> vectorOf(const std::string& hex) {
     return Hex2Bit::convertHexString2BitVec(hex.c_str(), static_cast<int>(4 * hex.size()), false, false, false);
 }
 
-/// Random data, whose seed a failure tells.
-class Hex2BitRandom : public Hex2BitTest {
-protected:
-    std::size_t below(std::size_t limit) { return m_random() % limit; }
-    std::string bytes(std::size_t count) {
-        std::string bytes(count, '\0');
-        std::generate(bytes.begin(), bytes.end(), [this] { return static_cast<char>(m_random()); });
-        return bytes;
-    }
-    std::string text(std::size_t length) {
-        const std::string_view alphabet = below(2) != 0 ? "0123456789abcdefABCDEF" : "01";
-        const std::size_t foreignPercent = 10 * below(2);
-        std::string result(length, ' ');
-        for (char& character : result) {
-            const bool isForeign = below(100) < foreignPercent;
-            character = isForeign ? static_cast<char>(1 + below(255)) : alphabet[below(alphabet.size())];
-        }
-        return result;
-    }
-
-private:
-    const unsigned m_seed = std::random_device()();
-    std::mt19937 m_random{m_seed};
-    const testing::ScopedTrace m_trace{__FILE__, __LINE__, "seed " + std::to_string(m_seed)};
-};
-
-TEST_P(Hex2BitRandom, AgreesWithTheModel) {
+TEST_F(Hex2BitTest, RandomDataAgreesWithTheModel) {
     const MessageRecorder silent;
-    for (std::size_t round = 0; round < std::size_t{151} * 30; ++round) {
+    Chance chance;
+    for (std::size_t round = 0; round < std::size_t{151} * 60; ++round) {
+        const VectorWidth width(chance.coin());
         const bool isLong = round % 151 == 0;
-        const std::size_t size = isLong ? below(30000) : round % 151;
+        const std::size_t size = isLong ? chance.below(30000) : round % 151;
         const std::string places{static_cast<char>(size % 256), static_cast<char>(size / 256)};
-        const std::string load = bytes(1) + places + bytes(1) + text(below(isLong ? 9000 : 140));
+        const std::string load =
+            chance.bytes(1) + places + chance.bytes(1) + chance.digits(chance.below(isLong ? 9000 : 140));
         ASSERT_TRUE(HexChecks::loadAgrees(Input(load))) << testing::PrintToString(load);
-        const std::string reading = bytes(4) + (below(2) != 0 ? text(below(140)) : bytes((size + 7) / 8));
+        const std::string reading =
+            chance.bytes(4) + (chance.coin() ? chance.digits(chance.below(140)) : chance.bytes((size + 7) / 8));
         ASSERT_TRUE(HexChecks::readingAgrees(Input(reading))) << testing::PrintToString(reading);
     }
 }
 
-TEST_P(Hex2BitRandom, ByteBuffersAreMirrored) {
+TEST_F(Hex2BitTest, ByteBuffersAreMirrored) {
+    Chance chance;
     for (int count = 0; count <= 140; ++count) {
-        const std::string random = bytes(static_cast<std::size_t>(count));
-        Bytes buffer(random.begin(), random.end());
-        Bytes expected = buffer;
-        std::transform(buffer.begin(), buffer.end(), expected.begin(), HexModel::mirrored);
-        const std::unique_ptr<unsigned char[]> copy(Hex2Bit::reverseBufferBits(buffer.data(), count));
-        EXPECT_EQ(Bytes(copy.get(), copy.get() + count), expected);
-        Hex2Bit::reverseReadBufferBits(buffer.data(), count);
-        EXPECT_EQ(buffer, expected);
+        const std::string random = chance.bytes(static_cast<std::size_t>(count));
+        Bytes expected(random.begin(), random.end());
+        std::transform(expected.begin(), expected.end(), expected.begin(), HexModel::mirrored);
+        for (const bool isWide : {false, true}) {
+            const VectorWidth width(isWide);
+            Bytes buffer(random.begin(), random.end());
+            const std::unique_ptr<unsigned char[]> copy(Hex2Bit::reverseBufferBits(buffer.data(), count));
+            EXPECT_EQ(Bytes(copy.get(), copy.get() + count), expected);
+            Hex2Bit::reverseReadBufferBits(buffer.data(), count);
+            EXPECT_EQ(buffer, expected);
+        }
     }
     EXPECT_NE(std::unique_ptr<unsigned char[]>(Hex2Bit::reverseBufferBits(nullptr, -1)), nullptr);
     Hex2Bit::reverseReadBufferBits(nullptr, 3);
 }
 
-TEST_P(Hex2BitTest, SwapsBitsAndBytes) {
+TEST_F(Hex2BitTest, SwapsBitsAndBytes) {
     EXPECT_EQ(Hex2Bit::swapBits(0x12), 0x48);
     Bytes five{1, 2, 3, 4, 5};
     EXPECT_EQ(Hex2Bit::swapBytes(five.data(), 5), five.data());
@@ -96,7 +75,7 @@ TEST_P(Hex2BitTest, SwapsBitsAndBytes) {
     EXPECT_EQ(Hex2Bit::swapBytes(nullptr, 4), nullptr);
 }
 
-TEST_P(Hex2BitTest, TextsOfWhatIsMissingOrEmpty) {
+TEST_F(Hex2BitTest, TextsOfWhatIsMissingOrEmpty) {
     const unsigned char bytes[] = {0xA1, 0x0F};
     EXPECT_EQ(taken(Hex2Bit::convertBinData2BinString(nullptr, 12, true)), "");
     EXPECT_EQ(taken(Hex2Bit::convertBinData2HexString(bytes, -1, true, true)), "");
@@ -105,7 +84,7 @@ TEST_P(Hex2BitTest, TextsOfWhatIsMissingOrEmpty) {
     EXPECT_EQ(taken(Hex2Bit::convertBinString2HexString("11110000", false)), "f0");
 }
 
-TEST_P(Hex2BitTest, HexTextToNumbers) {
+TEST_F(Hex2BitTest, HexTextToNumbers) {
     // The number, and the one with ones as the fill value.
     const std::tuple<const char*, int, int, int> cases[] = {
         {"1234", 2, 0x34, 0x34}, {"12", 4, 0x1200, 0x12FF},
@@ -125,7 +104,7 @@ TEST_P(Hex2BitTest, HexTextToNumbers) {
     EXPECT_EQ(Hex2Bit::convertBin2Int(nullptr, 8), 0);
 }
 
-TEST_P(Hex2BitTest, NumbersIntoNewVectors) {
+TEST_F(Hex2BitTest, NumbersIntoNewVectors) {
     EXPECT_EQ(Hex2Bit::convertInt2BitVec(0xB, 8)->data()[0], 0x0B);
     EXPECT_EQ(Hex2Bit::convertLong2BitVec(0x1FF, 4)->data()[0], 0x0F);
     EXPECT_EQ(Hex2Bit::convertInt2BitVec(-1, 8)->data()[0], 0x00);
@@ -134,7 +113,7 @@ TEST_P(Hex2BitTest, NumbersIntoNewVectors) {
     EXPECT_EQ(Hex2Bit::convertInt2BitVec(0xB, 8)->data()[0], 0xFF);
 }
 
-TEST_P(Hex2BitTest, WidthsOnBothSidesOfEachStep) {
+TEST_F(Hex2BitTest, WidthsOnBothSidesOfEachStep) {
     // Worked out for every value there is: the widths, multiples of 4, grow by 4 behind these values and nowhere else.
     std::size_t width = 0;
     for (const int last : {0, 14, 254, 4094, 65534, 1048574, 16777199, 268435208}) {
@@ -145,7 +124,7 @@ TEST_P(Hex2BitTest, WidthsOnBothSidesOfEachStep) {
     EXPECT_EQ(Hex2Bit::convertInt2BitVec(0x7FFFFFFF)->length(), width);
 }
 
-TEST_P(Hex2BitTest, NumbersToText) {
+TEST_F(Hex2BitTest, NumbersToText) {
     const std::pair<int, const char*> texts[] = {
         {0, "00000000"}, {1, "1"},     {14, "e"},        {15, "0f"},
         {255, "0ff"},    {256, "100"}, {-1, "00000000"}, {0x7FFFFFFF, "7fffffff"}};
@@ -162,7 +141,7 @@ TEST_P(Hex2BitTest, NumbersToText) {
     EXPECT_STREQ(Hex2Bit::convertInt2HexString(1), "f");
 }
 
-TEST_P(Hex2BitTest, VectorsToCharacters) {
+TEST_F(Hex2BitTest, VectorsToCharacters) {
     const MessageRecorder messages;
     char out[8] = "before";
     EXPECT_TRUE(Hex2Bit::convertBitVec2String(vectorOf("410042").get(), out, true));
@@ -176,7 +155,7 @@ TEST_P(Hex2BitTest, VectorsToCharacters) {
     EXPECT_FALSE(Hex2Bit::convertBitVec2String(vectorOf("41").get(), nullptr));
 }
 
-TEST_P(Hex2BitTest, HexDigitsAtAnAddress) {
+TEST_F(Hex2BitTest, HexDigitsAtAnAddress) {
     const unsigned char bytes[] = {0xA1, 0x0F, 0x33, 0xCC};
     const RLBitVec vector(bytes, 32);
     EXPECT_EQ(taken(Hex2Bit::getHexStringByHexAddress(&vector, 3, 6, 8)), "cc0000") << "nothing behind the end";
@@ -187,7 +166,7 @@ TEST_P(Hex2BitTest, HexDigitsAtAnAddress) {
     EXPECT_EQ(Hex2Bit::getHexStringByHexAddress(nullptr, 0, 2, 8), nullptr);
 }
 
-TEST_P(Hex2BitTest, NewVectors) {
+TEST_F(Hex2BitTest, NewVectors) {
     const std::pair<std::unique_ptr<RLBitVec>, const char*> cases[] = {
         {Hex2Bit::convertHexString2BitVec("1", 16, false, false, true), "0000000000000001"},
         {Hex2Bit::convertHexString2BitVec("1", 16, false, false, false), "0001000000000000"},
@@ -202,7 +181,7 @@ TEST_P(Hex2BitTest, NewVectors) {
     EXPECT_NE(Hex2Bit::convertBinString2BinData(nullptr, -8, false), nullptr);
 }
 
-TEST_P(Hex2BitTest, FillValueAndInitialise) {
+TEST_F(Hex2BitTest, FillValueAndInitialise) {
     Hex2Bit::setInitValue(true);
     HexModel::NumberedVec vector(12, Numbering::Mirrored);
     Hex2Bit::convertHexString2BitVec(&vector, "0", 4, false, false, true);
@@ -213,7 +192,7 @@ TEST_P(Hex2BitTest, FillValueAndInitialise) {
     EXPECT_EQ(bytes[0] & bytes[2], 0xFF) << "an array of (12 + 14) / 8 bytes";
 }
 
-TEST_P(Hex2BitTest, PlainTextIntoHeldVectors) {
+TEST_F(Hex2BitTest, PlainTextIntoHeldVectors) {
     RLBitVec vector(20);
     Hex2Bit::convertString2BitVec(&vector, "AB", 2, true, false);
     EXPECT_EQ(bitsOf(vector), "01000010100000100000") << "loaded like any text of 16 bits";
@@ -224,7 +203,7 @@ TEST_P(Hex2BitTest, PlainTextIntoHeldVectors) {
     EXPECT_EQ(bitsOf(small), "01111110");
 }
 
-TEST_P(Hex2BitTest, NullTextsAndVectorsAndNoSizeLeaveEverythingAlone) {
+TEST_F(Hex2BitTest, NullTextsAndVectorsAndNoSizeLeaveEverythingAlone) {
     RLBitVec vector(8, true);
     Hex2Bit::convertHexString2BitVec(&vector, nullptr, 8, false, false, false);
     Hex2Bit::convertHexString2BitVec(&vector, "12", -5, true, false, false);
@@ -239,7 +218,7 @@ TEST_P(Hex2BitTest, NullTextsAndVectorsAndNoSizeLeaveEverythingAlone) {
 }
 
 #ifdef NDEBUG
-TEST_P(Hex2BitTest, IndexesBeyondTheVectorArePassedOver) {
+TEST_F(Hex2BitTest, IndexesBeyondTheVectorArePassedOver) {
     RLBitVec vector(6);
     Hex2Bit::convertHexString2BitVec(&vector, "fe", 8, false, false, false);
     EXPECT_EQ(bitsOf(vector), "111111");
@@ -252,9 +231,5 @@ TEST_P(Hex2BitTest, IndexesBeyondTheVectorArePassedOver) {
     EXPECT_EQ(bitsOf(other), "100000");
 }
 #endif
-
-const auto widthName = [](const auto& width) { return width.param ? "Wide" : "Narrow"; };
-INSTANTIATE_TEST_SUITE_P(Width, Hex2BitTest, testing::Bool(), widthName);
-INSTANTIATE_TEST_SUITE_P(Width, Hex2BitRandom, testing::Bool(), widthName);
 
 }  // namespace
