@@ -1,35 +1,31 @@
 // The shipped preference table and the enumerators that name its rows.
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <string>
 
 #include "DataPath.h"
-#include "HkStr.h"
 #include "Preference.h"
 
 namespace {
 
-std::string withoutUnderscores(std::string name) {
-    name.erase(std::remove(name.begin(), name.end(), '_'), name.end());
-    return name;
-}
+#define TESSAL_NAME(name) #name,
+constexpr const char* enumerators[] = {TESSAL_PREFERENCES(TESSAL_NAME)};
+#undef TESSAL_NAME
 
 TEST(ShippedPreferences, EveryEnumeratorIsTheRowOfItsName) {
     DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
     TessalPreference& preferences = *TessalPreference::getPreferenceObject();
     int row = 0;
-#define TESSAL_CHECK(name)                                                                                            \
-    EXPECT_EQ(static_cast<int>(TessalPreference::name), row);                                                         \
-    EXPECT_EQ(                                                                                                        \
-        HkStr::ICompare(TessalPreference::pref2String(TessalPreference::name), withoutUnderscores(#name).c_str()), 0) \
-        << #name;                                                                                                     \
-    EXPECT_STRNE(preferences.getPreference(TessalPreference::name), "");                                              \
-    ++row;
-    TESSAL_PREFERENCES(TESSAL_CHECK)
-#undef TESSAL_CHECK
-    EXPECT_STREQ(preferences.getPreference(static_cast<TessalPreference::PREFERENCE>(row)), "") << "one row too many";
+    for (std::string name : enumerators) {
+        name.erase(std::remove(name.begin(), name.end(), '_'), name.end());
+        const auto preference = TessalPreference::PREFERENCE(row++);
+        EXPECT_THAT(TessalPreference::pref2String(preference), testing::StrCaseEq(name));
+        EXPECT_STRNE(preferences.getPreference(preference), "") << name;
+    }
+    EXPECT_STREQ(preferences.getPreference(TessalPreference::PREFERENCE(row)), "") << "one row too many";
 }
 
 }  // namespace
