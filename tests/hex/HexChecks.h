@@ -56,7 +56,8 @@ inline bool loadAgrees(Input input) {
 /// An array as text of both kinds in both orders, and as a number.
 inline bool bytesAgree(const unsigned char* bytes, int bits) {
     const Model model = HexModel::modelOf(RLBitVec(bytes, static_cast<std::size_t>(bits)));
-    bool agrees = Hex2Bit::convertBin2Int(bytes, bits) == HexModel::number(model);
+    bool agrees = Hex2Bit::convertBin2Int(bytes, bits) == HexModel::number(model) &&
+                  Hex2Bit::convertBin2Long(bytes, bits) == HexModel::number(model);
     for (const bool positionOrder : {false, true}) {
         const std::string binary = HexModel::binaryText(bytes, bits, positionOrder);
         agrees = agrees && taken(Hex2Bit::convertBinData2BinString(bytes, bits, positionOrder)) == binary;
@@ -75,7 +76,8 @@ inline bool textAgrees(const std::string& text, int count) {
     cut.resize(characters, '0');
     Model model = HexModel::modelOf(RLBitVec(4 * characters, Hex2Bit::m_initValue));
     HexModel::loadHex(model, text, 4 * count, false, false);
-    bool agrees = Hex2Bit::convertHexString2Int(text.c_str(), count) == HexModel::number(model);
+    bool agrees = Hex2Bit::convertHexString2Int(text.c_str(), count) == HexModel::number(model) &&
+                  Hex2Bit::convertHexString2Long(text.c_str(), count) == HexModel::number(model);
     for (const bool byteMode : {false, true}) {
         agrees = agrees && taken(Hex2Bit::convertBinString2HexString(text.c_str(), count, byteMode)) ==
                                HexModel::hexText(cut, byteMode);

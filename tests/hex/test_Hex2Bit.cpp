@@ -4,7 +4,6 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <tuple>
 
 #include "BitView.h"
 #include "MessageRecorder.h"
@@ -25,10 +24,6 @@ protected:
 /// The bits by index, 0 first.
 std::string bitsOf(const RLBitVec& vector) {
     return toGroupedText(vector, 0);
-}
-
-std::unique_ptr<RLBitVec> vectorOf(const std::string& hex) {
-    return Hex2Bit::convertHexString2BitVec(hex.c_str(), static_cast<int>(4 * hex.size()), false, false, false);
 }
 
 TEST_F(Hex2BitTest, RandomDataAgreesWithTheModel) {
@@ -75,33 +70,19 @@ TEST_F(Hex2BitTest, SwapsBitsAndBytes) {
     EXPECT_EQ(Hex2Bit::swapBytes(nullptr, 4), nullptr);
 }
 
-TEST_F(Hex2BitTest, TextsOfWhatIsMissingOrEmpty) {
+TEST_F(Hex2BitTest, TextsAndNumbersOfWhatIsMissingOrEmpty) {
     const unsigned char bytes[] = {0xA1, 0x0F};
     EXPECT_EQ(taken(Hex2Bit::convertBinData2BinString(nullptr, 12, true)), "");
     EXPECT_EQ(taken(Hex2Bit::convertBinData2HexString(bytes, -1, true, true)), "");
     EXPECT_EQ(taken(Hex2Bit::convertBinString2HexString("1010", 0, true)), "");
     EXPECT_EQ(taken(Hex2Bit::convertBinString2HexString(nullptr, 8, true)), "00");
     EXPECT_EQ(taken(Hex2Bit::convertBinString2HexString("11110000", false)), "f0");
-}
-
-TEST_F(Hex2BitTest, HexTextToNumbers) {
-    // The number, and the one with ones as the fill value.
-    const std::tuple<const char*, int, int, int> cases[] = {
-        {"1234", 2, 0x34, 0x34}, {"12", 4, 0x1200, 0x12FF},
-        {"80000001", 8, 1, 1},   {"1 2", 2, 0x20, 0x2F},  // three characters counted: the digit 1 is cut
-        {"12", -3, 0, 0},        {nullptr, 2, 0, 0xFF},
-    };
-    for (const auto& [text, digits, number, filled] : cases) {
-        for (const bool fill : {false, true}) {
-            Hex2Bit::setInitValue(fill);
-            EXPECT_EQ(Hex2Bit::convertHexString2Int(text, digits), fill ? filled : number);
-            EXPECT_EQ(Hex2Bit::convertHexString2Long(text, digits), fill ? filled : number);
-        }
-    }
-    const unsigned char bytes[] = {0x12, 0x34, 0xFF, 0xFF};
-    EXPECT_EQ(Hex2Bit::convertBin2Long(bytes, 32), 0x7FFF3412);
     EXPECT_EQ(Hex2Bit::convertBin2Int(bytes, -1), 0);
     EXPECT_EQ(Hex2Bit::convertBin2Int(nullptr, 8), 0);
+    EXPECT_EQ(Hex2Bit::convertHexString2Int("12", -3), 0);
+    EXPECT_EQ(Hex2Bit::convertHexString2Int("1 2", 2), 0x20) << "three characters counted: the digit 1 is cut";
+    Hex2Bit::setInitValue(true);
+    EXPECT_EQ(Hex2Bit::convertHexString2Int(nullptr, 2), 0xFF);
 }
 
 TEST_F(Hex2BitTest, NumbersIntoNewVectors) {
@@ -144,15 +125,14 @@ TEST_F(Hex2BitTest, NumbersToText) {
 TEST_F(Hex2BitTest, VectorsToCharacters) {
     const MessageRecorder messages;
     char out[8] = "before";
-    EXPECT_TRUE(Hex2Bit::convertBitVec2String(vectorOf("410042").get(), out, true));
-    EXPECT_STREQ(out, "AB");
-    EXPECT_TRUE(messages.all().empty());
-    EXPECT_FALSE(Hex2Bit::convertBitVec2String(vectorOf("41f242").get(), out, true));
+    const auto plain = Hex2Bit::convertString2BitVec("AB", 2, false, false);
+    EXPECT_TRUE(Hex2Bit::convertBitVec2String(plain.get(), out));
+    EXPECT_FALSE(Hex2Bit::convertBitVec2String(Hex2Bit::convertString2BitVec("A\xF2", 2, false, false).get(), out));
     EXPECT_STREQ(out, "A");
     EXPECT_EQ(messages.status(), std::vector<std::string>{" The binary data cannot be displayed"});
     EXPECT_TRUE(Hex2Bit::convertBitVec2String(nullptr, out));
     EXPECT_STREQ(out, "");
-    EXPECT_FALSE(Hex2Bit::convertBitVec2String(vectorOf("41").get(), nullptr));
+    EXPECT_FALSE(Hex2Bit::convertBitVec2String(plain.get(), nullptr));
 }
 
 TEST_F(Hex2BitTest, HexDigitsAtAnAddress) {
