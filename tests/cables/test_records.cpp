@@ -153,7 +153,7 @@ TEST(CableInfoStream, IsSixLinesWhateverTheStreamWasSetTo) {
 }
 
 TEST(CableInfoStream, TextsOfAnyLengthPassWhole) {
-    for (const std::size_t length : {200, 255, 256, 1000}) {
+    for (const std::size_t length : {200U, 255U, 256U, 1000U}) {
         const std::string name(length, 'n');
         CableInfo cable = sampleCable(name);
         EXPECT_EQ(written(cable), "4\nUSB2\n0\n6000000\n" + std::to_string(length) + "\n" + name + "\n");
