@@ -4,8 +4,6 @@
 #include <iostream>
 #include <stdexcept>
 
-#include "host/Role.h"
-
 namespace {
 
 int answer(Access& access, const std::string& line) {
@@ -21,10 +19,18 @@ const Role portUser{"port user", &usePort};
 int usePort(const RoleArguments& arguments) {
     Access access(std::stoi(arguments.at(0)), static_cast<Access::ACCESS_TYPE>(std::stoi(arguments.at(1))));
     std::cout << "open" << std::endl;
-    for (std::string line; std::getline(std::cin, line) && line != "end";) {
+    for (std::string line; std::getline(std::cin, line);) {
         std::cout << answer(access, line) << std::endl;
     }
     return 0;
+}
+
+std::unique_ptr<ChildProcess> startPortUser(int port, Access::ACCESS_TYPE type, const char* role) {
+    auto process = ChildProcess::start(role, {std::to_string(port), std::to_string(type)});
+    if (process->read() != "open") {
+        throw std::runtime_error("the child did not open its port");
+    }
+    return process;
 }
 
 int freshPort() {
@@ -33,18 +39,6 @@ int freshPort() {
     static const auto range = std::chrono::duration_cast<std::chrono::microseconds>(start).count() % 1000000;
     static int next = static_cast<int>(range) * 1000 + 10000;
     return ++next;
-}
-
-PortUser::PortUser(int port, Access::ACCESS_TYPE type)
-    : m_process("port user", {std::to_string(port), std::to_string(type)}) {
-    if (m_process.read() != "open") {
-        throw std::runtime_error("the child did not open its port");
-    }
-}
-
-int PortUser::end() {
-    m_process.write("end");
-    return m_process.wait();
 }
 
 bool isFree(int port) {

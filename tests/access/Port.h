@@ -1,31 +1,23 @@
 // Ports that no other test, and no other run of the tests at the same time, uses; and a process that works on one.
 #pragma once
 
+#include <memory>
 #include <string>
-#include <vector>
 
 #include "Access.h"
 #include "host/ChildProcess.h"
+#include "host/Role.h"
 
 /// An id of its own at each call.
 int freshPort();
 
 /// A process with one Access, which does what it is told by the lines "lock", "dec" and "clients", and answers each
-/// with its result. It ends in order at "end".
-class PortUser {
-public:
-    explicit PortUser(int port, Access::ACCESS_TYPE type = Access::SHARE);
-
-    int ask(const char* operation) { return std::stoi(m_process.ask(operation)); }
-    void kill() { m_process.kill(); }
-    int end();
-
-private:
-    ChildProcess m_process;
-};
+/// with its result. Another role than "port user" ends in usePort().
+std::unique_ptr<ChildProcess> startPortUser(int port, Access::ACCESS_TYPE type = Access::SHARE,
+                                            const char* role = "port user");
 
 /// What the process does: a role with a port and a type.
-int usePort(const std::vector<std::string>& arguments);
+int usePort(const RoleArguments& arguments);
 
 /// True if the machine holds nothing of the semaphore of a SHARE.
 bool isNothingLeft(int port);

@@ -200,48 +200,35 @@ TEST(NamedSemaphore, RefusesWhatCannotBe) {
     EXPECT_STRNE(NamedSemaphore::explainLastError(), "");
 }
 
-TEST(AccessProcesses, ShareOneCount) {
-    const int port = freshPort();
-    Access mine(port, Access::SHARE);
-    ASSERT_TRUE(mine.lock());
-    PortUser other(port);
-    EXPECT_EQ(other.ask("lock"), 0);
-    EXPECT_TRUE(mine.unlock());
-    EXPECT_EQ(other.ask("lock"), 1);
-    EXPECT_FALSE(mine.lock());
-    EXPECT_EQ(other.end(), 0);  // its destructor gives back
-    EXPECT_TRUE(mine.lock());
-}
-
 TEST(AccessProcesses, KilledHolderLeavesAFreshPortIfNobodyElseHasIt) {
     const int port = freshPort();
-    PortUser holder(port);
-    ASSERT_EQ(holder.ask("lock"), 1);
+    const auto holder = startPortUser(port);
+    ASSERT_EQ(holder->ask("lock"), "1");
     EXPECT_FALSE(isFree(port));
-    holder.kill();
+    holder->kill();
     EXPECT_TRUE(isFree(port));
 }
 
 TEST(AccessProcesses, KilledHolderLeavesTheCountToThoseWhoRemain) {
     const int port = freshPort();
     Access keeper(port, Access::SHARE);
-    PortUser holder(port);
-    ASSERT_EQ(holder.ask("lock"), 1);
-    holder.kill();
+    const auto holder = startPortUser(port);
+    ASSERT_EQ(holder->ask("lock"), "1");
+    holder->kill();
     EXPECT_FALSE(keeper.lock());
-    EXPECT_EQ(PortUser(port).ask("lock"), 0);
+    EXPECT_EQ(startPortUser(port)->ask("lock"), "0");
     EXPECT_TRUE(keeper.cleanLock());
     EXPECT_TRUE(keeper.lock());
 }
 
 TEST(AccessProcesses, KilledClientsKeepTheirSlotsUntilTheLastOneGoes) {
     const int port = freshPort();
-    PortUser first(port, Access::COUNT);
-    PortUser second(port, Access::COUNT);
-    EXPECT_EQ(first.ask("dec") + second.ask("dec"), 2);
-    first.kill();
-    EXPECT_EQ(second.ask("clients"), 2);
-    second.kill();
+    const auto first = startPortUser(port, Access::COUNT);
+    const auto second = startPortUser(port, Access::COUNT);
+    EXPECT_EQ(first->ask("dec") + second->ask("dec"), "11");
+    first->kill();
+    EXPECT_EQ(second->ask("clients"), "2");
+    second->kill();
     EXPECT_EQ(Access(port, Access::COUNT).getNormalizedCount(), 0);
 }
 
@@ -257,8 +244,8 @@ TEST(AccessSteps, KilledAtEachHostCallLeavesTheCountToThoseWhoRemainOrAFreshPort
                 keepers.emplace_back(port, Access::SHARE);
                 ASSERT_TRUE(keepers.front().lock());
             }
-            ChildProcess child("stepper", {"kill", std::to_string(step), std::to_string(port)});
-            gotThrough = child.wait() == 0;
+            const auto child = ChildProcess::start("stepper", {std::to_string(port), std::to_string(step)});
+            gotThrough = child->wait() == 0;
             ASSERT_EQ(isFree(port), !isKept);
             ASSERT_TRUE(!isKept || keepers.front().unlock());
             ASSERT_TRUE(isFree(port));

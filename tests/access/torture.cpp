@@ -13,39 +13,48 @@
 #include <iostream>
 #include <random>
 #include <thread>
+#include <utility>
 
 #include "Access.h"
 #include "Port.h"
+#include "TemporaryDirectory.h"
 #include "host/Role.h"
 #include "host/SharedFile.h"
 
 namespace {
 
-using Clock = std::chrono::steady_clock;
+using std::chrono::milliseconds;
 
 constexpr int maxWorkers = 500;  // in one round, those that take a killed one's place included
 
 /// What outlives a killed worker.
 struct Board {
+    std::atomic<int> port;
     std::atomic<int> finish;
     std::atomic<int> holder;  ///< number of the worker that drives the port now; 0 for none
-    std::atomic<int> working[maxWorkers + 1];
     std::atomic<int> doomed[maxWorkers + 1];
+    // Of all rounds:
     std::atomic<int> openings;
     std::atomic<int> locks;
     std::atomic<int> faults;
+
+    void expect(bool holds, const char* fault) {
+        if (!holds) {
+            ++faults;
+            std::fprintf(stderr, "torture of port %d: %s\n", port.load(), fault);
+        }
+    }
 };
 
 class Worker {
 public:
-    Worker(Board& board, int number, int port, unsigned seed)
-        : m_board(board), m_number(number), m_port(port), m_random(seed) {}
+    Worker(Board& board, int number, unsigned seed) : m_board(board), m_number(number), m_random(seed) {}
 
     void work() {
-        m_board.working[m_number] = 1;
+        std::cout << "working" << std::endl;
         do {
-            Access share(m_port, Access::SHARE);
-            Access count(m_port, Access::COUNT);
+            Access share(m_board.port, Access::SHARE);
+            Access count(m_board.port, Access::COUNT);
             ++m_board.openings;
             for (auto rounds = 1 + m_random() % 20; rounds > 0; --rounds) {
                 useShare(share);
@@ -62,207 +71,176 @@ private:
         ++m_board.locks;
         int other = 0;
         if (!m_board.holder.compare_exchange_strong(other, m_number)) {
-            expect(m_board.doomed[other] != 0, "two holders");
+            m_board.expect(m_board.doomed[other] != 0, "two holders");
             m_board.holder = m_number;
         }
         const auto longest = m_random() % 4 == 0 ? 100000U : 500U;
         for (auto pause = m_random() % longest; pause > 0; --pause) {
-            expect(m_board.holder == m_number, "another holder came in");
+            m_board.expect(m_board.holder == m_number, "another holder came in");
         }
         m_board.holder = 0;
-        expect(share.unlock(), "somebody else gave the unit back");
+        m_board.expect(share.unlock(), "somebody else gave the unit back");
     }
 
     void useCount(Access& count) {
         if (count.decCount() == 1) {
             const int clients = count.getNormalizedCount();
-            expect(clients >= 1 && clients <= 5, "a wrong number of clients");
-            expect(count.incCount() > 0, "a slot too many");
-        }
-    }
-
-    void expect(bool holds, const char* fault) {
-        if (!holds) {
-            ++m_board.faults;
-            std::fprintf(stderr, "worker %d on port %d: %s\n", m_number, m_port, fault);
+            m_board.expect(clients >= 1 && clients <= 5, "a wrong number of clients");
+            m_board.expect(count.incCount() > 0, "a slot too many");
         }
     }
 
     Board& m_board;
     int m_number;
-    int m_port;
     std::mt19937 m_random;
 };
 
 const Role worker{"torture worker", [](const RoleArguments& arguments) {
                       const SharedFile file(arguments.at(0), sizeof(Board));
-                      const int number = std::stoi(arguments.at(1));
-                      const auto seed = static_cast<unsigned>(std::stoul(arguments.at(3)));
-                      Worker(file.as<Board>(), number, std::stoi(arguments.at(2)), seed).work();
+                      const auto seed = static_cast<unsigned>(std::stoul(arguments.at(2)));
+                      Worker(file.as<Board>(), std::stoi(arguments.at(1)), seed).work();
                       return 0;
                   }};
 
-struct Totals {
-    int rounds = 0;
-    int kills = 0;
-    int killedHolders = 0;
-    long openings = 0;
-    long locks = 0;
-    int faults = 0;
-};
-
-/// One round; half of them keep a handle of their own, so that the semaphore lives through them, and
-/// half of them kill.
-class Round {
+class Torture {
 public:
-    Round(int number, std::mt19937& random, Totals& totals)
-        : m_path(testing::TempDir() + "tessal_torture_" + std::to_string(freshPort())),
-          m_file(m_path, sizeof(Board)),
-          m_board(m_file.as<Board>()),
-          m_port(freshPort()),
-          m_isKept(number % 2 != 0),
-          m_hasKills(number % 4 >= 2),
-          m_random(random),
-          m_totals(totals) {}
-    Round(const Round&) = delete;
-    Round& operator=(const Round&) = delete;
+    explicit Torture(unsigned seed) : m_random(seed) {}
 
-    ~Round() { std::remove(m_path.c_str()); }
+    int faults() const { return m_board.faults; }
 
-    void run(std::chrono::milliseconds duration) {
-        std::vector<Access> keepers;
-        if (m_isKept) {
-            keepers.emplace_back(m_port, Access::SHARE);
-            keepers.emplace_back(m_port, Access::COUNT);
+    /// Half of the rounds keep a handle of their own, so that the semaphore lives through them, and half of them kill.
+    void run(std::chrono::seconds time) {
+        const auto end = Clock::now() + time;
+        const milliseconds timeOfRound(time < std::chrono::seconds(20) ? 300 : 2000);
+        int rounds = 0;
+        for (; rounds < 4 || Clock::now() < end; ++rounds) {
+            runRound(rounds % 2 != 0, rounds % 4 >= 2, timeOfRound);
         }
-        for (std::size_t place = 0; place < workers; ++place) {
+        m_board.expect(m_kills > 0, "nobody was killed");
+        std::printf("torture: %d rounds, %d kills (%d of holders), %d openings, %d locks, %d faults\n", rounds, m_kills,
+                    m_killedHolders, m_board.openings.load(), m_board.locks.load(), faults());
+    }
+
+private:
+    using Clock = std::chrono::steady_clock;
+
+    struct Place {
+        int number;
+        std::unique_ptr<ChildProcess> process;
+        bool isWorking;
+    };
+
+    void runRound(bool isKept, bool hasKills, milliseconds time) {
+        prepareBoard();
+        const int locks = m_board.locks;
+        std::vector<Access> keepers;
+        if (isKept) {
+            keepers.emplace_back(m_board.port, Access::SHARE);
+            keepers.emplace_back(m_board.port, Access::COUNT);
+        }
+        for (Place& place : m_places) {
             start(place);
         }
-        awaitWorkers();
-        const auto end = Clock::now() + duration;
+        for (Place& place : m_places) {
+            await(place);
+        }
+        const auto end = Clock::now() + time;
         do {
+            Place& place = m_places.at(m_random() % m_places.size());
+            await(place);
             std::this_thread::sleep_for(std::chrono::microseconds(m_random() % 5000));
-            if (m_hasKills) {
-                killOne();
+            if (hasKills) {
+                kill(place);
             }
         } while (Clock::now() < end && m_started < maxWorkers);
         finish();
-        if (m_isKept) {
+        m_board.expect(hasKills || m_board.locks > locks, "nobody got the port");
+        if (isKept) {
             checkKept(keepers.front(), keepers.back());
             keepers.clear();
         }
         checkFresh();
-        addUp();
     }
 
-private:
-    static constexpr std::size_t workers = 4;
+    void prepareBoard() {
+        m_board.port = freshPort();
+        m_board.finish = 0;
+        m_board.holder = 0;
+        for (std::atomic<int>& mark : m_board.doomed) {
+            mark = 0;
+        }
+        m_started = 0;
+    }
 
-    void start(std::size_t place) {
-        m_numbers.at(place) = ++m_started;
-        m_workers.at(place) = ChildProcess(
-            "torture worker", {m_path, std::to_string(m_started), std::to_string(m_port), std::to_string(m_random())});
+    void start(Place& place) {
+        const std::string number = std::to_string(++m_started);
+        place = {m_started, ChildProcess::start("torture worker", {m_path, number, std::to_string(m_random())}), false};
     }
 
     /// A loaded machine takes its time to start programs, which is no part of the round.
-    void awaitWorkers() {
-        const auto end = Clock::now() + std::chrono::seconds(60);
-        for (const int number : m_numbers) {
-            while (m_board.working[number] == 0 && Clock::now() < end) {
-                std::this_thread::sleep_for(std::chrono::milliseconds(1));
-            }
-            expect(m_board.working[number] != 0, "a worker did not start");
+    void await(Place& place) {
+        if (!std::exchange(place.isWorking, true)) {
+            m_board.expect(place.process->read() == "working", "a worker did not start");
         }
     }
 
-    void killOne() {
-        const std::size_t place = m_random() % workers;
-        const int number = m_numbers.at(place);
-        if (m_board.working[number] == 0) {
-            return;
-        }
-        m_board.doomed[number] = 1;  // before it dies, so that nobody takes what it leaves for a fault
-        m_workers.at(place).kill();
-        m_killedHolders += m_board.holder == number;
+    void kill(Place& place) {
+        m_board.doomed[place.number] = 1;  // before it dies, so that nobody takes what it leaves for a fault
+        place.process->kill();
+        m_killedHolders += m_board.holder == place.number;
         ++m_kills;
         start(place);
     }
 
     void finish() {
         m_board.finish = 1;
-        for (ChildProcess& process : m_workers) {
-            expect(process.wait() == 0, "a worker did not come to its end");
+        for (const Place& place : m_places) {
+            m_board.expect(place.process->wait() == 0, "a worker did not come to its end");
         }
     }
 
     void checkKept(Access& share, Access& count) {
+        const int kills = m_started - static_cast<int>(m_places.size());
         const bool isWhole = share.lock();
-        expect(isWhole || m_kills > 0, "the unit is lost");
-        expect(!isWhole || !share.lock(), "there are two units");
-        expect(count.getNormalizedCount() <= m_kills, "slots are lost");
+        m_board.expect(isWhole || kills > 0, "the unit is lost");
+        m_board.expect(!isWhole || !share.lock(), "there are two units");
+        m_board.expect(count.getNormalizedCount() <= kills, "slots are lost");
     }
 
     void checkFresh() {
-        expect(isFree(m_port), "the port is blocked");
-        expect(Access(m_port, Access::COUNT).getNormalizedCount() == 0, "slots outlive their clients");
-        expect(isNothingLeft(m_port), "the semaphore outlives its handles");
+        m_board.expect(isFree(m_board.port), "the port is blocked");
+        m_board.expect(Access(m_board.port, Access::COUNT).getNormalizedCount() == 0, "slots outlive their clients");
+        m_board.expect(isNothingLeft(m_board.port), "the semaphore outlives its handles");
     }
 
-    void addUp() {
-        ++m_totals.rounds;
-        m_totals.kills += m_kills;
-        m_totals.killedHolders += m_killedHolders;
-        m_totals.openings += m_board.openings;
-        m_totals.locks += m_board.locks;
-        m_totals.faults += m_board.faults;
-        expect(m_kills > 0 || m_board.locks > 0, "nobody got the port");
-    }
-
-    void expect(bool holds, const char* fault) {
-        if (!holds) {
-            ++m_totals.faults;
-            std::fprintf(stderr, "round %d, port %d, %d kills: %s\n", m_totals.rounds, m_port, m_kills, fault);
-        }
-    }
-
-    const std::string m_path;
-    SharedFile m_file;
-    Board& m_board;
-    const int m_port;
-    const bool m_isKept;
-    const bool m_hasKills;
-    std::mt19937& m_random;
-    Totals& m_totals;
-    std::array<ChildProcess, workers> m_workers;
-    std::array<int, workers> m_numbers{};
-    int m_started = 0;
+    const TemporaryDirectory m_directory;
+    const std::string m_path = m_directory / "board";
+    const SharedFile m_file{m_path, sizeof(Board)};
+    Board& m_board = m_file.as<Board>();
+    std::mt19937 m_random;
+    std::array<Place, 4> m_places{};
+    int m_started = 0;  ///< in this round
     int m_kills = 0;
     int m_killedHolders = 0;
 };
 
-Totals torture(int seconds, unsigned seed) {
-    std::mt19937 random(seed);
-    Totals totals;
-    const auto end = Clock::now() + std::chrono::seconds(seconds);
-    while (Clock::now() < end || totals.rounds < 4) {
-        Round(totals.rounds, random, totals).run(std::chrono::milliseconds(seconds < 20 ? 300 : 2000));
-    }
-    std::printf("torture: seed %u, %d rounds, %d kills (%d of holders), %ld openings, %ld locks, %d faults\n", seed,
-                totals.rounds, totals.kills, totals.killedHolders, totals.openings, totals.locks, totals.faults);
-    return totals;
+/// Gives the number of faults.
+int torture(int seconds, unsigned seed) {
+    std::printf("torture: seed %u\n", seed);
+    Torture rounds(seed);
+    rounds.run(std::chrono::seconds(seconds));
+    return rounds.faults();
 }
 
 const Role byHand{"torture", [](const RoleArguments& arguments) {
                       const unsigned seed = arguments.size() > 1 ? static_cast<unsigned>(std::stoul(arguments[1]))
                                                                  : std::random_device{}();
-                      return torture(std::stoi(arguments.at(0)), seed).faults == 0 ? 0 : 1;
+                      return torture(std::stoi(arguments.at(0)), seed) == 0 ? 0 : 1;
                   }};
 
 }  // namespace
 
 TEST(AccessTorture, FindsNoFault) {
     const char* const seconds = std::getenv("TESSAL_TORTURE_SECONDS");
-    const Totals totals = torture(seconds != nullptr ? std::atoi(seconds) : 4, std::random_device{}());
-    EXPECT_EQ(totals.faults, 0);
-    EXPECT_GT(totals.kills, 0);
+    EXPECT_EQ(torture(seconds != nullptr ? std::atoi(seconds) : 4, std::random_device{}()), 0);
 }

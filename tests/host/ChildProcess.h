@@ -2,23 +2,19 @@
 // has a bound; what is still alive at the end of the object is killed.
 #pragma once
 
+#include <chrono>
 #include <memory>
 #include <string>
 #include <vector>
 
-struct HostChild;
-
 class ChildProcess {
 public:
-    /// No process; only to be assigned to.
-    ChildProcess();
-    /// Starts this program in @p role with these arguments. Its standard input and output are ours.
-    ChildProcess(const std::string& role, const std::vector<std::string>& arguments);
-    ~ChildProcess();
-    ChildProcess(ChildProcess&&) noexcept;
-    ChildProcess& operator=(ChildProcess&&) noexcept;
+    /// Starts this program in @p role with these arguments; throws where that fails. Its standard input and output are
+    /// ours.
+    static std::unique_ptr<ChildProcess> start(const std::string& role, const std::vector<std::string>& arguments);
+    virtual ~ChildProcess() = default;
 
-    void write(const std::string& line);
+    void write(const std::string& line) { send(line + "\n"); }
     /// The child's next line without its end; "(nothing)" where none comes in time or the child has ended.
     std::string read();
     std::string ask(const std::string& line) {
@@ -27,14 +23,18 @@ public:
     }
 
     /// Ends it at whatever instruction it is, without any clean-up, and waits until it is gone.
-    void kill();
+    virtual void kill() = 0;
     /// Waits for its end: its exit status, or -1 if it was killed or does not end in time.
-    int wait();
+    virtual int wait() = 0;
 
-    /// The host's number of the process.
-    long id() const;
+protected:
+    using Clock = std::chrono::steady_clock;
+    static constexpr std::chrono::seconds patience{60};
 
 private:
-    std::unique_ptr<HostChild> m_child;
+    virtual void send(const std::string& text) = 0;
+    /// Adds what has come; false where nothing comes until @p end or the child has ended.
+    virtual bool receive(std::string& received, Clock::time_point end) = 0;
+
     std::string m_received;
 };

@@ -1,7 +1,6 @@
 // What can go wrong with a lock between processes on a POSIX host, one test a fault.
 #include <dlfcn.h>
 #include <gmock/gmock.h>
-#include <grp.h>
 #include <gtest/gtest.h>
 #include <sched.h>
 #include <signal.h>
@@ -13,7 +12,6 @@
 #include <chrono>
 #include <cstring>
 #include <fstream>
-#include <functional>
 #include <iostream>
 #include <unordered_map>
 
@@ -21,6 +19,7 @@
 #include "Access.h"
 #include "MessageRecorder.h"
 #include "host/Role.h"
+#include "host/posix/Forked.h"
 #include "platform/NamedSemaphore.h"
 #include "platform/posix/CountSegment.h"
 #include "platform/posix/NamedSemaphoreKeys.h"
@@ -33,8 +32,8 @@ namespace {
 
 /// What happens at one host call of this process: at the n-th from now on or, unless its name is null, the n-th of it.
 struct Step {
-    enum { Kill, Stop, Fail } action;
     int left;
+    int signal;  ///< 0 for a failure
     const char* call;
     int error;
 } step;
@@ -44,7 +43,7 @@ bool passStep(const char* call) {
         return true;
     }
     errno = step.error;
-    return step.action != Step::Fail && ::raise(step.action == Step::Kill ? SIGKILL : SIGSTOP) == 0;
+    return step.signal != 0 && ::raise(step.signal) == 0;
 }
 
 void setStep(const Step& next) {
@@ -56,36 +55,20 @@ key_t keyOf(int port) {
     return NamedSemaphore::keyOfName(("CableSharing" + std::to_string(port)).c_str());
 }
 
-void openLockAndClose(int port) {
-    Access access(port, Access::SHARE);
-    access.lock();
-    access.unlock();
-}
-
-/// Runs the body in a forked child and gives its exit status, -1 if it ended by a signal.
-int inChild(const std::function<int()>& body) {
-    const pid_t child = ::fork();
-    if (child == 0) {
-        ::_exit(body());
-    }
-    int status = 0;
-    ::waitpid(child, &status, 0);
-    return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-}
-
-/// Opens, locks, gives back and closes a port, and is ended or stopped at one of the host calls on that way.
-const Role stepper{
-    "stepper", [](const RoleArguments& arguments) {
-        setStep({arguments.at(0) == "kill" ? Step::Kill : Step::Stop, std::stoi(arguments.at(1)), nullptr, 0});
-        std::cout << "started" << std::endl;
-        openLockAndClose(std::stoi(arguments.at(2)));
-        return 0;
-    }};
+/// Opens, locks, gives back and closes a port, and is ended, or stopped if told so, at one of the host calls on that
+/// way.
+const Role stepper{"stepper", [](const RoleArguments& arguments) {
+                       setStep({std::stoi(arguments.at(1)), arguments.size() > 2 ? SIGSTOP : SIGKILL, nullptr, 0});
+                       std::cout << ::getpid() << std::endl;
+                       Access access(std::stoi(arguments.at(0)), Access::SHARE);
+                       access.lock();
+                       access.unlock();
+                       return 0;
+                   }};
 
 const Role otherUser{"other user", [](const RoleArguments& arguments) {
                          ::umask(0777);
-                         const bool isOther = ::setgroups(0, nullptr) + ::setgid(65534) + ::setuid(65534) == 0;
-                         return isOther ? usePort(arguments) : 1;
+                         return becomeAnotherUser() ? usePort(arguments) : 1;
                      }};
 
 /// Forks while it holds the port. The child sleeps or executes another program.
@@ -110,12 +93,6 @@ protected:
     }
 };
 
-std::chrono::milliseconds durationOf(const std::function<void()>& body) {
-    const auto start = std::chrono::steady_clock::now();
-    body();
-    return std::chrono::duration_cast<std::chrono::milliseconds>(std::chrono::steady_clock::now() - start);
-}
-
 }  // namespace
 
 bool isNothingLeft(int port) {
@@ -125,16 +102,17 @@ bool isNothingLeft(int port) {
 
 TEST(AccessSteps, StoppedInsideTheOpeningLockDelaysOthersForABoundedTime) {
     const int port = freshPort();
-    ChildProcess stopped("stepper", {"stop", "6", std::to_string(port)});
-    ASSERT_EQ(stopped.read(), "started");
+    const auto stopped = ChildProcess::start("stepper", {std::to_string(port), "6", "stop"});
+    const pid_t process = std::stoi(stopped->read());
     siginfo_t info{};
-    ASSERT_EQ(::waitid(P_PID, static_cast<id_t>(stopped.id()), &info, WSTOPPED), 0);
+    ASSERT_EQ(::waitid(P_PID, static_cast<id_t>(process), &info, WSTOPPED), 0);
     const MessageRecorder messages;
-    const auto duration = durationOf([&] { EXPECT_FALSE(Access(port, Access::SHARE).lock()); });
-    EXPECT_LT(duration, std::chrono::seconds(10));
-    EXPECT_THAT(messages.info(), ElementsAre(HasSubstr("process " + std::to_string(stopped.id()) + " stands still")));
-    ::kill(static_cast<pid_t>(stopped.id()), SIGCONT);
-    EXPECT_EQ(stopped.wait(), 0);
+    const auto start = std::chrono::steady_clock::now();
+    EXPECT_FALSE(Access(port, Access::SHARE).lock());
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(10));
+    EXPECT_THAT(messages.info(), ElementsAre(HasSubstr("process " + std::to_string(process) + " stands still")));
+    ::kill(process, SIGCONT);
+    EXPECT_EQ(stopped->wait(), 0);
     EXPECT_TRUE(isFree(port));
     EXPECT_TRUE(isNothingLeft(port));
 }
@@ -148,7 +126,7 @@ TEST(AccessSteps, EachHostCallMayFail) {
                 SCOPED_TRACE(std::string(call) + " " + std::to_string(number) + " " + std::to_string(error));
                 const MessageRecorder messages;
                 {
-                    setStep({Step::Fail, number, call, error});
+                    setStep({number, 0, call, error});
                     Access access(port, Access::SHARE);
                     const bool opened = messages.info().empty();
                     EXPECT_EQ(access.lock(), opened);
@@ -189,10 +167,10 @@ TEST(AccessFork, ChildDoesNotKeepThePortOfItsKilledParent) {
     for (const char* const mode : {"sleep", "exec"}) {
         SCOPED_TRACE(mode);
         const int port = freshPort();
-        ChildProcess parent("forker", {mode, std::to_string(port)});
-        const pid_t child = std::stoi(parent.read());
+        const auto parent = ChildProcess::start("forker", {mode, std::to_string(port)});
+        const pid_t child = std::stoi(parent->read());
         EXPECT_FALSE(isFree(port));
-        parent.kill();
+        parent->kill();
         EXPECT_TRUE(isFree(port));
         EXPECT_TRUE(isNothingLeft(port));
         EXPECT_EQ(::kill(child, SIGKILL), 0);
@@ -201,23 +179,22 @@ TEST(AccessFork, ChildDoesNotKeepThePortOfItsKilledParent) {
 
 TEST_F(AccessUsers, ShareAPortWhateverTheirUmask) {
     const int port = freshPort();
-    ChildProcess other("other user", {std::to_string(port), std::to_string(Access::SHARE)});
-    ASSERT_EQ(other.read(), "open");
-    EXPECT_EQ(other.ask("lock"), "1");
+    const auto other = startPortUser(port, Access::SHARE, "other user");
+    EXPECT_EQ(other->ask("lock"), "1");
     Access access(port, Access::SHARE);
     EXPECT_FALSE(access.lock());
     EXPECT_TRUE(access.cleanLock());
-    EXPECT_EQ(other.ask("lock"), "1");
+    EXPECT_EQ(other->ask("lock"), "1");
 }
 
 TEST_F(AccessUsers, LastCloserWhoMayNotRemoveLeavesItToTheNextOne) {
     const int port = freshPort();
-    EXPECT_EQ(inChild([&] {
-                  Access access(port, Access::SHARE);
-                  return access.lock() && ::setuid(65534) == 0 ? 0 : 1;
-              }),
-              0);
-    EXPECT_EQ(inChild([&] { return ::setuid(65534) == 0 && isFree(port) ? 0 : 1; }), 0);
+    const int closed = inChild([&] {
+        Access access(port, Access::SHARE);
+        return access.lock() && becomeAnotherUser() ? 0 : 1;
+    });
+    EXPECT_EQ(closed, 0);
+    EXPECT_EQ(inChild([&] { return becomeAnotherUser() && isFree(port) ? 0 : 1; }), 0);
     EXPECT_FALSE(isNothingLeft(port));
     EXPECT_TRUE(isFree(port));
     EXPECT_TRUE(isNothingLeft(port));

@@ -2,8 +2,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <iostream>
-
 #include "../Port.h"
 #include "Access.h"
 #include "MessageRecorder.h"
@@ -12,8 +10,6 @@
 #include "platform/windows/SemaphoreCalls.h"
 
 using testing::ElementsAre;
-using testing::HasSubstr;
-using testing::IsSupersetOf;
 
 namespace {
 
@@ -24,37 +20,27 @@ using AccessScripted = ScriptedCalls;
 
 int callsLeft = 0;
 
-void endAtTheLastCall() {
-    if (--callsLeft == 0) {
-        ::TerminateProcess(::GetCurrentProcess(), 0xDEAD);
-    }
+/// Ends the process before the last of the calls that are left.
+template <class Result, class... Arguments>
+void countCalls(Result(WINAPI*& call)(Arguments...)) {
+    static Result(WINAPI* const real)(Arguments...) = call;
+    call = [](Arguments... arguments) -> Result {
+        if (--callsLeft == 0) {
+            ::TerminateProcess(::GetCurrentProcess(), 0xDEAD);
+        }
+        return real(arguments...);
+    };
 }
 
 /// Opens, locks, gives back and closes a port, and is killed before one of its host calls.
 const Role stepper{"stepper", [](const RoleArguments& arguments) {
                        callsLeft = std::stoi(arguments.at(1));
-                       semaphoreCalls.openSemaphore = [](DWORD access, BOOL inherited, LPCSTR name) {
-                           endAtTheLastCall();
-                           return ::OpenSemaphoreA(access, inherited, name);
-                       };
-                       semaphoreCalls.createSemaphore = [](LPSECURITY_ATTRIBUTES security, LONG initial, LONG maximum,
-                                                           LPCSTR name) {
-                           endAtTheLastCall();
-                           return ::CreateSemaphoreA(security, initial, maximum, name);
-                       };
-                       semaphoreCalls.waitForSingleObject = [](HANDLE handle, DWORD bound) {
-                           endAtTheLastCall();
-                           return ::WaitForSingleObject(handle, bound);
-                       };
-                       semaphoreCalls.releaseSemaphore = [](HANDLE handle, LONG units, LPLONG previous) {
-                           endAtTheLastCall();
-                           return ::ReleaseSemaphore(handle, units, previous);
-                       };
-                       semaphoreCalls.closeHandle = [](HANDLE handle) {
-                           endAtTheLastCall();
-                           return ::CloseHandle(handle);
-                       };
-                       Access access(std::stoi(arguments.at(2)), Access::SHARE);
+                       countCalls(semaphoreCalls.openSemaphore);
+                       countCalls(semaphoreCalls.createSemaphore);
+                       countCalls(semaphoreCalls.waitForSingleObject);
+                       countCalls(semaphoreCalls.releaseSemaphore);
+                       countCalls(semaphoreCalls.closeHandle);
+                       Access access(std::stoi(arguments.at(0)), Access::SHARE);
                        access.lock();
                        access.unlock();
                        return 0;

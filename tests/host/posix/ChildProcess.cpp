@@ -8,11 +8,11 @@
 #include <stdexcept>
 #include <thread>
 
-#include "../HostChild.h"
+#include "../ChildProcess.h"
 
 namespace {
 
-struct PosixChild final : HostChild {
+struct PosixChild final : ChildProcess {
     pid_t process = -1;
     int toChild = -1;
     int fromChild = -1;
@@ -91,13 +91,13 @@ struct PosixChild final : HostChild {
         }
         return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
     }
-
-    long id() const override { return process; }
 };
 
 }  // namespace
 
-std::unique_ptr<HostChild> HostChild::start(std::vector<std::string> words) {
+std::unique_ptr<ChildProcess> ChildProcess::start(const std::string& role, const std::vector<std::string>& arguments) {
+    std::vector<std::string> words{"child", "--role", role};
+    words.insert(words.end(), arguments.begin(), arguments.end());
     ::signal(SIGPIPE, SIG_IGN);
     return std::make_unique<PosixChild>(words);
 }

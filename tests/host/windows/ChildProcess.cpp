@@ -2,13 +2,13 @@
 
 #include <stdexcept>
 
-#include "../HostChild.h"
+#include "../ChildProcess.h"
 
 namespace {
 
 constexpr UINT killedStatus = 0xDEAD;
 
-struct WindowsChild final : HostChild {
+struct WindowsChild final : ChildProcess {
     PROCESS_INFORMATION process{};
     HANDLE toChild = nullptr;
     HANDLE fromChild = nullptr;
@@ -76,16 +76,14 @@ struct WindowsChild final : HostChild {
         }
         return status == killedStatus ? -1 : static_cast<int>(status);
     }
-
-    long id() const override { return static_cast<long>(process.dwProcessId); }
 };
 
 }  // namespace
 
-std::unique_ptr<HostChild> HostChild::start(std::vector<std::string> words) {
-    std::string line;
-    for (const std::string& word : words) {
-        line += (line.empty() ? "\"" : " \"") + word + '"';
+std::unique_ptr<ChildProcess> ChildProcess::start(const std::string& role, const std::vector<std::string>& arguments) {
+    std::string line = "child --role \"" + role + '"';
+    for (const std::string& argument : arguments) {
+        line += " \"" + argument + '"';
     }
     return std::make_unique<WindowsChild>(line);
 }
