@@ -13,16 +13,9 @@
 #include "TessalSocket.h"
 #include "platform/StreamSocket.h"
 
-/// Two ends, each behind a multiplexer.
-class Link {
-public:
-    virtual ~Link() = default;
-    /// Sets the connection up; false is a failed test.
-    virtual bool connect() = 0;
-    virtual void closeServerEnd() = 0;
-    virtual const char* receiveFailure() const = 0;
-    /// True when both ends may be used at once by two threads.
-    virtual bool isConcurrent() const { return true; }
+/// Two ends, each behind a multiplexer. A link sets itself up by connect(), and false is a failed test.
+struct Link {
+    static constexpr std::size_t blockSize = std::size_t{3} << 20;  ///< more than the buffers between the ends hold
 
     TessalPortMux client{false};
     TessalPortMux server{false};
@@ -48,7 +41,10 @@ inline std::unique_ptr<TessalSocket> listeningServer(int& port) {
 
 class SocketLink : public Link {
 public:
-    bool connect() override {
+    static constexpr const char* receiveFailure = " recv() failed: ";
+
+    ~SocketLink() { closeServerEnd(); }
+    bool connect() {
         int port = 0;
         m_server = listeningServer(port);
         if (m_server == nullptr) {
@@ -61,14 +57,12 @@ public:
         server.setSocketHandle(m_server.get());
         return connected.get() && m_server->getClientSocketFd() != TessalSocket::noSocket;
     }
-    ~SocketLink() override { SocketLink::closeServerEnd(); }
-    void closeServerEnd() override {
+    void closeServerEnd() {
         if (m_server != nullptr && m_server->getClientSocketFd() != TessalSocket::noSocket) {
             m_server->closeSocket(m_server->getClientSocketFd());
             m_server->setClientSocketFd(TessalSocket::noSocket);
         }
     }
-    const char* receiveFailure() const override { return " recv() failed: "; }
 
 private:
     std::unique_ptr<TessalSocket> m_server;
@@ -81,66 +75,52 @@ inline std::string freshPipeName() {
 
 class PipeLink : public Link {
 public:
-    bool connect() override {
-        const std::string name = freshPipeName();
-        m_server = std::make_unique<TessalPipe>(0, name.c_str());
-        m_client = std::make_unique<TessalPipe>(1, name.c_str());
+    static constexpr const char* receiveFailure = "ReadFile failed: ";
+
+    bool connect() {
         client.selectPipe(true);
         server.selectPipe(true);
-        client.setPipeHandle(m_client.get());
-        server.setPipeHandle(m_server.get());
-        if (!m_server->initialize()) {
+        client.setPipeHandle(&m_client);
+        server.setPipeHandle(&m_server);
+        if (!m_server.initialize()) {
             return false;
         }
-        std::future<bool> connected = std::async(std::launch::async, [&] { return m_client->initialize(); });
-        return m_server->waitForClient() && connected.get();
+        std::future<bool> connected = std::async(std::launch::async, [&] { return m_client.initialize(); });
+        return m_server.waitForClient() && connected.get();
     }
-    void closeServerEnd() override { m_server->deinitialize(); }
-    const char* receiveFailure() const override { return "ReadFile failed: "; }
+    void closeServerEnd() { m_server.deinitialize(); }
 
 private:
-    std::unique_ptr<TessalPipe> m_server;
-    std::unique_ptr<TessalPipe> m_client;
+    const std::string m_name = freshPipeName();
+    TessalPipe m_server{0, m_name.c_str()};
+    TessalPipe m_client{1, m_name.c_str()};
 };
 
-/// A host without a network that moves one byte a call.
+/// This host, moving one byte a call.
 class ByteByByteHost : public platform::SocketHost {
 public:
-    bool start() override { return true; }
-    void stop() override {}
-    platform::Socket openServer() override { return 0; }
-    platform::Socket openClient() override { return 1; }
-    bool bindAny(platform::Socket, std::uint16_t) override { return true; }
-    void listen(platform::Socket, int) override {}
-    platform::Socket accept(platform::Socket, sockaddr*, int*) override { return 2; }
-    bool resolve(const char*, std::uint16_t, platform::SocketAddress&) override { return true; }
-    bool connect(platform::Socket, const platform::SocketAddress&) override { return true; }
-    std::int64_t receive(platform::Socket socket, char* data, int) override {
-        std::deque<char>& way = m_ways[socket % 2];
-        if (way.empty()) {
-            return 0;
-        }
-        *data = way.front();
-        way.pop_front();
-        return 1;
+    using Socket = platform::Socket;
+    using Address = platform::SocketAddress;
+
+    bool start() override { return m_real.start(); }
+    void stop() override { m_real.stop(); }
+    Socket openServer() override { return m_real.openServer(); }
+    Socket openClient() override { return m_real.openClient(); }
+    bool bindAny(Socket socket, std::uint16_t port) override { return m_real.bindAny(socket, port); }
+    void listen(Socket socket, int backlog) override { m_real.listen(socket, backlog); }
+    Socket accept(Socket server, sockaddr* from, int* length) override { return m_real.accept(server, from, length); }
+    bool resolve(const char* name, std::uint16_t port, Address& address) override {
+        return m_real.resolve(name, port, address);
     }
-    std::int64_t send(platform::Socket socket, const char* data, int) override {
-        if (m_closed) {
-            return -1;
-        }
-        m_ways[1 - socket % 2].push_back(*data);
-        return 1;
-    }
-    bool close(platform::Socket) override {
-        m_closed = true;
-        return true;
-    }
-    int lastError() override { return 104; }
-    void pause(int) override {}
+    bool connect(Socket socket, const Address& address) override { return m_real.connect(socket, address); }
+    std::int64_t receive(Socket socket, char* data, int) override { return m_real.receive(socket, data, 1); }
+    std::int64_t send(Socket socket, const char* data, int) override { return m_real.send(socket, data, 1); }
+    bool close(Socket socket) override { return m_real.close(socket); }
+    int lastError() override { return m_real.lastError(); }
+    void pause(int milliseconds) override { m_real.pause(milliseconds); }
 
 private:
-    std::deque<char> m_ways[2];
-    bool m_closed = false;
+    platform::SocketHost& m_real = platform::realSocketHost();
 };
 
 /// A host that the sockets of this process use while it lives.
@@ -154,7 +134,6 @@ struct HostInPlace {
     Host host;
 };
 
-class ByteByByteLink : private HostInPlace<ByteByByteHost>, public SocketLink {
-public:
-    bool isConcurrent() const override { return false; }
+struct ByteByByteLink : private HostInPlace<ByteByByteHost>, public SocketLink {
+    static constexpr std::size_t blockSize = 10000;
 };

@@ -45,6 +45,7 @@ public:
     }
     bool connect(platform::Socket, const platform::SocketAddress&) override { return attempts > connectsBeforeSuccess; }
     bool close(platform::Socket) override { return !closeFails; }
+    int lastError() override { return 104; }
     void pause(int milliseconds) override { pauses += milliseconds; }
 };
 
