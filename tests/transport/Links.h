@@ -3,10 +3,10 @@
 
 #include <gtest/gtest.h>
 
-#include <deque>
 #include <future>
 #include <memory>
 #include <string>
+#include <thread>
 
 #include "TessalPipe.h"
 #include "TessalPortMux.h"
@@ -137,3 +137,26 @@ struct HostInPlace {
 struct ByteByByteLink : private HostInPlace<ByteByByteHost>, public SocketLink {
     static constexpr std::size_t blockSize = 10000;
 };
+
+/// Sends a block to the server's end, which a thread serves, and back.
+template <class LinkType>
+void expectEcho(LinkType& link) {
+    std::string sent(LinkType::blockSize, '\0');
+    for (std::size_t i = 0; i < sent.size(); ++i) {
+        sent[i] = static_cast<char>(1 + (i * 31 + i / 4096) % 255);
+    }
+    const int length = static_cast<int>(sent.size());
+    std::thread echo([&] {
+        std::string block(sent.size(), '?');
+        EXPECT_TRUE(link.server.read(block.data(), length));
+        EXPECT_EQ(link.server.writeString(block.c_str()), length);
+    });
+    EXPECT_TRUE(link.client.write(sent.data(), length));
+    int announced = 0;
+    link.client.readInt(&announced);
+    EXPECT_EQ(announced, length);
+    std::string back(sent.size(), '?');
+    EXPECT_TRUE(link.client.read(back.data(), length));
+    echo.join();
+    EXPECT_EQ(back, sent);
+}

@@ -5,8 +5,6 @@
 
 #include <limits>
 #include <string>
-#include <thread>
-#include <vector>
 
 #include "DataBuffer.h"
 #include "MessageRecorder.h"
@@ -65,25 +63,7 @@ TYPED_TEST(Transport, FieldsComeBackAsTheyWent) {
 }
 
 TYPED_TEST(Transport, BlocksOfAnySizePassWhole) {
-    std::string sent(TypeParam::blockSize, '\0');
-    for (std::size_t i = 0; i < sent.size(); ++i) {
-        sent[i] = static_cast<char>(1 + (i * 31 + i / 4096) % 255);
-    }
-    const int length = static_cast<int>(sent.size());
-    // Both directions at once: neither end's buffers hold what the other sends.
-    std::string back(sent.size(), '?');
-    int announced = 0;
-    std::thread echo([&] {
-        std::string block(sent.size(), '?');
-        EXPECT_TRUE(this->link.server.read(block.data(), length));
-        EXPECT_EQ(this->link.server.writeString(block.c_str()), length);
-    });
-    EXPECT_TRUE(this->link.client.write(sent.data(), length));
-    this->link.client.readInt(&announced);
-    EXPECT_EQ(announced, length);
-    EXPECT_TRUE(this->link.client.read(back.data(), length));
-    echo.join();
-    EXPECT_EQ(back, sent);
+    expectEcho(this->link);
 }
 
 TYPED_TEST(Transport, APeerThatHasClosedIsAFailureAtOnce) {

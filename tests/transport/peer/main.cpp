@@ -34,13 +34,11 @@ std::string block() {
 
 bool sendFields(TessalSocket& end) {
     const TessalSocket::Socket socket = end.getClientSocketFd();
-    int sent = 0;
     for (const int number : numbers) {
-        sent += end.writeInt(socket, number);
+        end.writeInt(socket, number);
     }
-    return sent == 12 && end.writeBool(socket, true) && end.writeBool(socket, false) &&
-           end.writeString(socket, "ab") == 2 && end.writeString(socket, nullptr) == 0 &&
-           end.writeSocket(block().data(), blockSize);
+    return end.writeBool(socket, true) && end.writeBool(socket, false) && end.writeString(socket, "ab") == 2 &&
+           end.writeString(socket, nullptr) == 0 && end.writeSocket(block().data(), blockSize);
 }
 
 bool readFields(TessalSocket& end) {
@@ -50,15 +48,16 @@ bool readFields(TessalSocket& end) {
         end.readInt(socket, &value);
         return value == number;
     };
+    const auto isNextFlag = [&](bool flag) {
+        bool value = !flag;
+        return end.readBool(socket, &value) && value == flag;
+    };
     const auto isNextText = [&](const std::string& text) {
         std::string bytes(text.size(), '\0');
         return end.read(socket, bytes.data(), static_cast<int>(text.size())) && bytes == text;
     };
-    bool first = false;
-    bool second = true;
-    return std::all_of(std::begin(numbers), std::end(numbers), isNext) && end.readBool(socket, &first) && first &&
-           end.readBool(socket, &second) && !second && isNext(2) && isNextText("ab") && isNext(0) &&
-           isNextText(block());
+    return std::all_of(std::begin(numbers), std::end(numbers), isNext) && isNextFlag(true) && isNextFlag(false) &&
+           isNext(2) && isNextText("ab") && isNext(0) && isNextText(block());
 }
 
 int outcome(bool isGood, const char* end) {

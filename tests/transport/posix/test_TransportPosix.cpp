@@ -17,7 +17,7 @@
 #include <future>
 #include <iterator>
 #include <string>
-#include <thread>
+#include <vector>
 
 #include "MessageRecorder.h"
 #include "host/posix/Forked.h"
@@ -40,20 +40,16 @@ public:
             body();
             ::raise(SIGSTOP);  // which tells that the body is done
             ::pause();
-            ::_exit(0);
         }
-        EXPECT_TRUE(isStopped());
+        int status = 0;
+        EXPECT_EQ(::waitpid(m_process, &status, WUNTRACED), m_process);
+        EXPECT_TRUE(WIFSTOPPED(status));
     }
     ~Child() { kill(); }
     Child(const Child&) = delete;
     Child& operator=(const Child&) = delete;
 
     void goOn() const { ::kill(m_process, SIGCONT); }
-    /// Waits for its next stop.
-    bool isStopped() const {
-        int status = 0;
-        return ::waitpid(m_process, &status, WUNTRACED) == m_process && WIFSTOPPED(status);
-    }
     void kill() {
         if (m_process > 0) {
             ::kill(m_process, SIGKILL);
@@ -201,19 +197,11 @@ TEST(TransportFaults, SignalsBreakNoTransfer) {
     ::sigaction(SIGALRM, &action, &former);
     const itimerval storm{{0, 500}, {0, 500}};
     ::setitimer(ITIMER_REAL, &storm, nullptr);
-    const auto transfer = [](auto&& link) {
-        ASSERT_TRUE(link.connect());
-        std::string block(std::size_t{4} << 20, 'x');
-        std::thread reader([&] {
-            std::string back(block.size(), '?');
-            EXPECT_TRUE(link.server.read(back.data(), static_cast<int>(back.size())));
-            EXPECT_EQ(back, block);
-        });
-        EXPECT_TRUE(link.client.write(block.data(), static_cast<int>(block.size())));
-        reader.join();
-    };
-    transfer(SocketLink());
-    transfer(PipeLink());
+    SocketLink socket;
+    PipeLink pipe;
+    ASSERT_TRUE(socket.connect() && pipe.connect());
+    expectEcho(socket);
+    expectEcho(pipe);
     const itimerval quiet{};
     ::setitimer(ITIMER_REAL, &quiet, nullptr);
     ::sigaction(SIGALRM, &former, nullptr);
@@ -241,26 +229,17 @@ TEST(TransportFaults, NoDescriptorLeaksAndNoneIsInherited) {
 }
 
 TEST(TransportFaults, ADescriptorLimitIsAFailureWithAMessage) {
-#if defined(__has_feature)
-#if __has_feature(address_sanitizer)
-    GTEST_SKIP() << "the sanitizer needs descriptors of its own";
-#endif
-#endif
-    rlimit former{};
-    ::getrlimit(RLIMIT_NOFILE, &former);
-    const int used = ::open("/dev/null", O_RDONLY | O_CLOEXEC);
-    rlimit tight = former;
-    tight.rlim_cur = static_cast<rlim_t>(used) + 1;
-    ::setrlimit(RLIMIT_NOFILE, &tight);
-    {
+    const int status = inChild([] {
+        const auto used = static_cast<rlim_t>(::open("/dev/null", O_RDONLY | O_CLOEXEC));
+        const rlimit tight{used + 1, used + 1};
+        ::setrlimit(RLIMIT_NOFILE, &tight);
         const MessageRecorder messages;
-        TessalSocket server(0, "", freshPort());
-        EXPECT_FALSE(server.initialize());
-        EXPECT_THAT(messages.status(), ElementsAre(" socket() failed: 24\n"));
-        EXPECT_FALSE(TessalPipe(0, freshPipeName().c_str()).initialize());
-    }
-    ::setrlimit(RLIMIT_NOFILE, &former);
-    ::close(used);
+        const bool hasSocket = TessalSocket(0, "", freshPort()).initialize();
+        const bool hasPipe = TessalPipe(0, freshPipeName().c_str()).initialize();
+        const bool isTold = messages.status() == std::vector<std::string>{" socket() failed: 24\n"};
+        return !hasSocket && !hasPipe && isTold ? 0 : 1;
+    });
+    EXPECT_EQ(status, 0);
 }
 
 }  // namespace
