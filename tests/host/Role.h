@@ -3,15 +3,30 @@
 //     const Role sleeper{"sleeper", [](const RoleArguments& arguments) { ...; return 0; }};
 #pragma once
 
+#include <cstdlib>
+#include <cstring>
+#include <map>
 #include <string>
 #include <vector>
 
 using RoleArguments = std::vector<std::string>;
 
-struct Role {
+class Role {
+public:
     using Body = int (*)(const RoleArguments&);
-    Role(const char* name, Body body);
+    Role(const char* name, Body body) { all()[name] = body; }
 
     /// Plays the role that the command line asks for and ends the program; returns where it asks for none.
-    static void playIfAsked(int argc, char** argv);
+    static void playIfAsked(int argc, char** argv) {
+        if (argc > 2 && std::strcmp(argv[1], "--role") == 0) {
+            const auto found = all().find(argv[2]);
+            std::exit(found != all().end() ? found->second({argv + 3, argv + argc}) : 2);
+        }
+    }
+
+private:
+    static std::map<std::string, Body>& all() {
+        static std::map<std::string, Body> roles;
+        return roles;
+    }
 };

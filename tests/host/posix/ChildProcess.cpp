@@ -1,36 +1,33 @@
-#include <fcntl.h>
+#include "../ChildProcess.h"
+
 #include <poll.h>
 #include <signal.h>
 #include <spawn.h>
+#include <sys/socket.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <stdexcept>
 #include <thread>
 
-#include "../ChildProcess.h"
-
 namespace {
 
 struct PosixChild final : ChildProcess {
     pid_t process = -1;
-    int toChild = -1;
-    int fromChild = -1;
+    int socket = -1;  ///< leads to the child's standard input and output
     int status = 0;
     bool ended = false;
 
     explicit PosixChild(std::vector<std::string>& words) {
-        int in[2];
-        int out[2];
-        if (::pipe2(in, O_CLOEXEC) != 0 || ::pipe2(out, O_CLOEXEC) != 0) {
-            throw std::runtime_error("no pipe for a child");
+        int ends[2];
+        if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends) != 0) {
+            throw std::runtime_error("no sockets for a child");
         }
-        toChild = in[1];
-        fromChild = out[0];
+        socket = ends[0];
         posix_spawn_file_actions_t actions;
         ::posix_spawn_file_actions_init(&actions);
-        ::posix_spawn_file_actions_adddup2(&actions, in[0], STDIN_FILENO);
-        ::posix_spawn_file_actions_adddup2(&actions, out[1], STDOUT_FILENO);
+        ::posix_spawn_file_actions_adddup2(&actions, ends[1], STDIN_FILENO);
+        ::posix_spawn_file_actions_adddup2(&actions, ends[1], STDOUT_FILENO);
         std::vector<char*> argv;
         for (std::string& word : words) {
             argv.push_back(word.data());
@@ -38,8 +35,7 @@ struct PosixChild final : ChildProcess {
         argv.push_back(nullptr);
         const int error = ::posix_spawn(&process, "/proc/self/exe", &actions, nullptr, argv.data(), environ);
         ::posix_spawn_file_actions_destroy(&actions);
-        ::close(in[0]);
-        ::close(out[1]);
+        ::close(ends[1]);
         if (error != 0) {
             throw std::runtime_error("cannot start a child");
         }
@@ -47,8 +43,7 @@ struct PosixChild final : ChildProcess {
 
     ~PosixChild() override {
         PosixChild::kill();
-        ::close(toChild);
-        ::close(fromChild);
+        ::close(socket);
     }
 
     bool reap(int options) {
@@ -56,20 +51,17 @@ struct PosixChild final : ChildProcess {
         return ended;
     }
 
-    void send(const std::string& text) override {
-        if (::write(toChild, text.data(), text.size()) < 0) {
-            return;  // it has ended, as the next read tells
-        }
-    }
+    // Where the child has ended nothing is sent, as the next read tells.
+    void send(const std::string& text) override { ::send(socket, text.data(), text.size(), MSG_NOSIGNAL); }
 
     bool receive(std::string& received, Clock::time_point end) override {
         const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(end - Clock::now()).count();
-        pollfd ready{fromChild, POLLIN, 0};
+        pollfd ready{socket, POLLIN, 0};
         char buffer[512];
         if (left <= 0 || ::poll(&ready, 1, static_cast<int>(left)) <= 0) {
             return false;
         }
-        const ssize_t count = ::read(fromChild, buffer, sizeof buffer);
+        const ssize_t count = ::read(socket, buffer, sizeof buffer);
         received.append(buffer, count > 0 ? static_cast<std::size_t>(count) : 0);
         return count > 0;
     }
@@ -98,6 +90,5 @@ struct PosixChild final : ChildProcess {
 std::unique_ptr<ChildProcess> ChildProcess::start(const std::string& role, const std::vector<std::string>& arguments) {
     std::vector<std::string> words{"child", "--role", role};
     words.insert(words.end(), arguments.begin(), arguments.end());
-    ::signal(SIGPIPE, SIG_IGN);
     return std::make_unique<PosixChild>(words);
 }
