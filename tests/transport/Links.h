@@ -135,7 +135,7 @@ struct HostInPlace {
 };
 
 struct ByteByByteLink : private HostInPlace<ByteByByteHost>, public SocketLink {
-    static constexpr std::size_t blockSize = 10000;
+    static constexpr std::size_t blockSize = 1000;
 };
 
 /// Sends a block to the server's end, which a thread serves, and back.
