@@ -5,6 +5,7 @@
 
 #include <future>
 #include <memory>
+#include <stdexcept>
 #include <string>
 #include <thread>
 
@@ -13,7 +14,7 @@
 #include "TessalSocket.h"
 #include "platform/StreamSocket.h"
 
-/// Two ends, each behind a multiplexer. A link sets itself up by connect(), and false is a failed test.
+/// Two ends, connected, each behind a multiplexer.
 struct Link {
     static constexpr std::size_t blockSize = std::size_t{3} << 20;  ///< more than the buffers between the ends hold
 
@@ -27,7 +28,7 @@ inline int freshPort() {
     return static_cast<int>(next++);
 }
 
-/// A server that listens; its port is found by trying.
+/// A server that listens; its port is found by trying. Throws where there is none.
 inline std::unique_ptr<TessalSocket> listeningServer(int& port) {
     for (int attempt = 0; attempt < 100; ++attempt) {
         port = freshPort();
@@ -36,29 +37,26 @@ inline std::unique_ptr<TessalSocket> listeningServer(int& port) {
             return server;
         }
     }
-    return nullptr;
+    throw std::runtime_error("no port for a server");
 }
 
 class SocketLink : public Link {
 public:
     static constexpr const char* receiveFailure = " recv() failed: ";
 
-    ~SocketLink() { closeServerEnd(); }
-    bool connect() {
+    SocketLink() {
         int port = 0;
         m_server = listeningServer(port);
-        if (m_server == nullptr) {
-            return false;
-        }
         m_client = std::make_unique<TessalSocket>(1, "127.0.0.1", port);
         std::future<bool> connected = std::async(std::launch::async, [&] { return m_client->initialize(); });
         m_server->setClientSocketFd(m_server->acceptClient(nullptr, nullptr));
         client.setSocketHandle(m_client.get());
         server.setSocketHandle(m_server.get());
-        return connected.get() && m_server->getClientSocketFd() != TessalSocket::noSocket;
+        EXPECT_TRUE(connected.get());
     }
+    ~SocketLink() { closeServerEnd(); }
     void closeServerEnd() {
-        if (m_server != nullptr && m_server->getClientSocketFd() != TessalSocket::noSocket) {
+        if (m_server->getClientSocketFd() != TessalSocket::noSocket) {
             m_server->closeSocket(m_server->getClientSocketFd());
             m_server->setClientSocketFd(TessalSocket::noSocket);
         }
@@ -77,16 +75,14 @@ class PipeLink : public Link {
 public:
     static constexpr const char* receiveFailure = "ReadFile failed: ";
 
-    bool connect() {
+    PipeLink() {
         client.selectPipe(true);
         server.selectPipe(true);
         client.setPipeHandle(&m_client);
         server.setPipeHandle(&m_server);
-        if (!m_server.initialize()) {
-            return false;
-        }
+        EXPECT_TRUE(m_server.initialize());
         std::future<bool> connected = std::async(std::launch::async, [&] { return m_client.initialize(); });
-        return m_server.waitForClient() && connected.get();
+        EXPECT_TRUE(m_server.waitForClient() && connected.get());
     }
     void closeServerEnd() { m_server.deinitialize(); }
 

@@ -17,8 +17,6 @@ using namespace std::string_literals;
 template <class LinkType>
 class Transport : public testing::Test {
 protected:
-    void SetUp() override { ASSERT_TRUE(link.connect()); }
-
     /// The next bytes at the server's end.
     std::string arrived(std::size_t count) {
         std::string bytes(count, '?');
