@@ -145,14 +145,14 @@ private:
             await(place);
         }
         const auto end = Clock::now() + time;
-        do {
-            Place& place = m_places.at(m_random() % m_places.size());
+        for (std::size_t turn = 0; Clock::now() < end && m_started < maxWorkers; ++turn) {
+            Place& place = m_places.at(turn % m_places.size());
             await(place);
             std::this_thread::sleep_for(std::chrono::microseconds(m_random() % 5000));
             if (hasKills) {
                 kill(place);
             }
-        } while (Clock::now() < end && m_started < maxWorkers);
+        }
         finish();
         m_board.expect(hasKills || m_board.locks > locks, "nobody got the port");
         if (isKept) {
