@@ -185,6 +185,7 @@ TEST_F(AccessUsers, ShareAPortWhateverTheirUmask) {
     EXPECT_FALSE(access.lock());
     EXPECT_TRUE(access.cleanLock());
     EXPECT_EQ(other->ask("lock"), "1");
+    other->kill();  // so that the last closer is here, and tidies up
 }
 
 TEST_F(AccessUsers, LastCloserWhoMayNotRemoveLeavesItToTheNextOne) {
