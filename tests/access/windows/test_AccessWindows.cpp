@@ -19,7 +19,7 @@ struct AccessScripted : testing::Test {
 
 int callsLeft = 0;
 
-/// Ends the process before the last of the calls that are left.
+/// Ends the process before the last of the calls that are left. No two of them are of one type.
 template <class Result, class... Arguments>
 void countCalls(Result(WINAPI*& call)(Arguments...)) {
     static Result(WINAPI* const real)(Arguments...) = call;
