@@ -31,6 +31,7 @@ std::vector<std::string> contentsFrom(std::string content) {
 template <class Text>
 std::vector<Text> textsOf(const std::vector<std::string>& contents) {
     std::vector<Text> texts;
+    texts.reserve(contents.size());
     for (const std::string& content : contents) {
         texts.emplace_back(content.c_str());
     }
@@ -53,6 +54,7 @@ template <class Text>
 void construct(benchmark::State& state, const std::string& content) {
     const std::vector<std::string> contents = contentsFrom(content);
     std::vector<const char*> sources;
+    sources.reserve(contents.size());
     for (const std::string& one : contents) {
         sources.push_back(one.c_str());
     }
