@@ -21,10 +21,16 @@ inline Lines splitCommand(const std::string& line) {
     return words;
 }
 
+/// The words as a program gets them; they live as long as @p words.
 inline std::vector<const char*> pointersTo(const Lines& words) {
     std::vector<const char*> pointers(words.size());
     std::transform(words.begin(), words.end(), pointers.begin(), [](const std::string& word) { return word.c_str(); });
     return pointers;
+}
+
+inline HkCmdArgs parsed(const char* format, const Lines& words, unsigned short flags = HkCmdArgs::Quiet,
+                        void (*callback)() = nullptr) {
+    return HkCmdArgs(static_cast<int>(words.size()), pointersTo(words).data(), format, callback, flags);
 }
 
 inline std::string groupDump(const HkCmdArgs& args, const HkCmdArgInfo& info, const char* format, int index) {
@@ -78,7 +84,5 @@ inline Lines dump(const HkCmdArgs& args, const char* format) {
 
 /// What a command line gives.
 inline Lines parse(const char* format, const std::string& line) {
-    const Lines words = splitCommand(line);
-    return dump(HkCmdArgs(static_cast<int>(words.size()), pointersTo(words).data(), format, nullptr, HkCmdArgs::Quiet),
-                format);
+    return dump(parsed(format, splitCommand(line)), format);
 }

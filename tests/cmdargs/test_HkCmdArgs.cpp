@@ -107,17 +107,16 @@ TEST(HkCmdArgs, ValuesAtTheEdgesOfTheirTypes) {
     for (const auto& [format, fitting, unfit] : cases) {
         for (const Lines* const values : {&fitting, &unfit}) {
             for (const std::string& value : *values) {
-                const char* const argv[] = {"cmd", "--", value.c_str()};
-                const HkCmdArgs args(3, argv, format, nullptr, HkCmdArgs::Quiet);
-                EXPECT_EQ(args.iserror() == 0, values == &fitting) << format << " " << value;
+                const bool isFitting = parsed(format, {"cmd", "--", value}).iserror() == 0;
+                EXPECT_EQ(isFitting, values == &fitting) << format << " " << value;
             }
         }
     }
 }
 
 TEST(HkCmdArgs, ReadsTypedValues) {
-    const char* const argv[] = {"CMD", "-n", "-2", "0x10", "abc", "-u", "0xFFFFFFFFFFFFFFFF", "-x", "EXO"};
-    const HkCmdArgs args(9, argv, "-n|-number <text>... [-u <hex>] [-x <mcs|exo>] [<file>]", nullptr, 0);
+    const HkCmdArgs args = parsed("-n|-number <text>... [-u <hex>] [-x <mcs|exo>] [<file>]",
+                                  splitCommand("CMD -n -2 0x10 abc -u 0xFFFFFFFFFFFFFFFF -x EXO"));
     ASSERT_EQ(args.iserror(), 0);
     EXPECT_STREQ(args.command(), "CMD");
     EXPECT_TRUE(args.integer("-NUMBER", 0) == -2 && args.integer("-n", 1) == 16 && args.integer("-n", 2, 7) == 7);
@@ -135,9 +134,9 @@ TEST(HkCmdArgs, ReadsTypedValues) {
 
 TEST(HkCmdArgs, ReportsEachErrorAsInfoThenTheUsageLine) {
     const MessageRecorder recorder;
-    const char* const argv[] = {"program", "-erse", "x", "-format", "mcx", "-fast", "-slow", "-f", "-e=1", "-E"};
     calls = 0;
-    const HkCmdArgs args(10, argv, program, &countCall, 0);
+    const HkCmdArgs args =
+        parsed(program, splitCommand("program -erse x -format mcx -fast -slow -f -e=1 -E"), 0, &countCall);
     EXPECT_THAT(recorder.info(),
                 ElementsAre("program: unknown switch \"-erse\"; did you mean -erase?\n",
                             "program: -format needs one of mcs, exo, tek, not \"mcx\"; did you mean mcs?\n",
@@ -155,13 +154,12 @@ TEST(HkCmdArgs, ReportsEachErrorAsInfoThenTheUsageLine) {
 TEST(HkCmdArgs, FlagsAndCallback) {
     const MessageRecorder recorder;
     calls = 0;
-    const char* const argv[] = {"cmd", "-pos", "1"};
-    EXPECT_EQ(HkCmdArgs(3, argv, "-position <int>", &countCall, 0).iserror() + calls, 0);
-    EXPECT_NE(HkCmdArgs(3, argv, "-position <int>", &countCall, HkCmdArgs::NoAbbreviation | HkCmdArgs::Quiet).iserror(),
-              0);
+    const Lines words{"cmd", "-pos", "1"};
+    EXPECT_EQ(parsed("-position <int>", words, 0, &countCall).iserror() + calls, 0);
+    parsed("-position <int>", words, HkCmdArgs::NoAbbreviation | HkCmdArgs::Quiet, &countCall);
     EXPECT_EQ(calls, 1);
     EXPECT_TRUE(recorder.all().empty());
-    const HkCmdArgs args(3, argv, "", nullptr, HkCmdArgs::NoUsage);
+    parsed("", words, HkCmdArgs::NoUsage);
     EXPECT_THAT(recorder.info(), ElementsAre("cmd: unknown switch \"-pos\"\n"));
 }
 
@@ -185,9 +183,7 @@ TEST(HkCmdArgs, BadCallsAreErrors) {
 
 TEST(HkCmdArgs, ManyErrorsAreCutAndLongTokensShortened) {
     const MessageRecorder recorder;
-    const Lines words(100001, "wrong\n");
-    const HkCmdArgs args(100001, pointersTo(words).data(), "[-p]", nullptr, HkCmdArgs::NoUsage);
-    EXPECT_EQ(args.errorCount(), 100000);
+    EXPECT_EQ(parsed("[-p]", Lines(100001, "wrong\n"), HkCmdArgs::NoUsage).errorCount(), 100000);
     ASSERT_THAT(recorder.info(), SizeIs(11));
     EXPECT_EQ(recorder.info()[0], "wrong\\x0A: unexpected argument \"wrong\\x0A\"\n");
     EXPECT_EQ(recorder.info()[10], "wrong\\x0A: and 99990 more errors\n");
@@ -203,8 +199,7 @@ TEST(HkCmdArgs, HundredThousandSwitchesAndFormatsBeyondTheCache) {
     for (int i = 0; i < 50000; ++i) {
         words.insert(words.end(), {"-p", std::to_string(i), "-name", "nnn"});
     }
-    const int count = static_cast<int>(words.size());
-    const HkCmdArgs args(count, pointersTo(words).data(), "(-p <int>)... (-name <text>)...", nullptr, 0);
+    const HkCmdArgs args = parsed("(-p <int>)... (-name <text>)...", words);
     EXPECT_EQ(args.integer("-p", 49999), 49999);
     EXPECT_THAT(args.order(), SizeIs(100000));
     for (int i = 0; i < 600; ++i) {

@@ -2,11 +2,11 @@
 
 #include <algorithm>
 #include <cstring>
+#include <future>
 #include <map>
 #include <random>
 #include <stdexcept>
 #include <string>
-#include <thread>
 #include <utility>
 #include <vector>
 
@@ -36,24 +36,18 @@ std::string sample(std::size_t length) {
     return text.substr(0, length);
 }
 
-TEST(HkString, IsOnePointerWithTheLengthWordBeforeTheText) {
+TEST(HkString, IsOnePointerWithTheLengthWordBeforeTheTextAndNeverNull) {
     static_assert(sizeof(HkString) == sizeof(char*));
-    for (const unsigned length : {0U, 1U, 2U, 3U, 4U, 7U, 8U, 15U, 16U, 30U, 31U, 32U, 33U, 64U, 1000U, 1U << 20}) {
-        expectIs(HkString(sample(length).c_str()), sample(length));
+    for (const std::string& text : {sample(1U << 20), std::string("a\0b", 3)}) {
+        expectIs(HkString(std::string_view(text)), text);
     }
-    expectIs(HkString(std::string_view("a\0b", 3)), std::string("a\0b", 3));
-}
-
-TEST(HkString, IsNeverNull) {
     HkString assigned("some text");
     assigned = nullptr;
     HkString moved("some text");
-    const HkString taken(std::move(moved));
+    expectIs(HkString(std::move(moved)), "some text");
     for (const HkString& text : {HkString(), HkString(nullptr), HkString(""), assigned, moved}) {
         expectIs(text, "");
-        EXPECT_EQ(text, HkString());
     }
-    expectIs(taken, "some text");
 }
 
 constexpr std::uint32_t emptying = 9;
@@ -168,25 +162,22 @@ TEST(HkString, RefusesWhatTheLengthWordCannotTell) {
 TEST(HkString, SeparateObjectsServeSeparateThreads) {
     const HkString shortText("zq73");
     const HkString longText(sample(500).c_str());
-    std::vector<HkString> results(4);
-    std::vector<std::thread> threads;
-    for (HkString& result : results) {
-        threads.emplace_back([&] {
-            thread_local HkString last;  // ends behind the thread's store of small blocks
-            for (int i = 0; i < 2000; ++i) {
-                HkString changed(longText);
-                changed += shortText;
-                last = longText;
-                result = changed;
-            }
-            last = shortText;
-        });
-    }
-    for (std::thread& thread : threads) {
-        thread.join();
-    }
-    for (const HkString& result : results) {
-        expectIs(result, sample(500) + "zq73");
+    const auto work = [&] {
+        thread_local HkString last;  // ends behind the thread's store of small blocks
+        HkString result;
+        for (int i = 0; i < 2000; ++i) {
+            HkString changed(longText);
+            changed += shortText;
+            last = longText;
+            result = changed;
+        }
+        last = shortText;
+        return result;
+    };
+    std::vector<std::future<HkString>> results(4);
+    std::generate(results.begin(), results.end(), [&] { return std::async(std::launch::async, work); });
+    for (std::future<HkString>& result : results) {
+        expectIs(result.get(), sample(500) + "zq73");
     }
 }
 
