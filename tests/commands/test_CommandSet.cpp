@@ -33,18 +33,19 @@ Words split(const char* line) {
     return commands != nullptr ? wordsOf(*commands) : Words();
 }
 
-std::string joined(const Words& words) {
-    std::string line;
-    for (const std::string& word : words) {
-        line += (line.empty() ? "" : "|") + word;
+/// The words between the bars; none in the empty text.
+Words pieces(const std::string& text) {
+    Words words;
+    std::istringstream in(text.empty() ? text : text + "|");
+    for (std::string word; std::getline(in, word, '|');) {
+        words.push_back(word);
     }
-    return line;
+    return words;
 }
 
-CommandSet setOf(const std::string& line) {
+CommandSet setOf(const std::string& text) {
     CommandSet commands;
-    std::istringstream words(line + "|");
-    for (std::string word; std::getline(words, word, '|');) {
+    for (const std::string& word : pieces(text)) {
         commands.addCommand(word.c_str());
     }
     return commands;
@@ -64,7 +65,7 @@ const std::pair<const char*, const char*> tokeniserCases[] = {
 TEST(CommandSet, SplitsALineAndRefusesAnOpenQuotation) {
     EXPECT_EQ(split(nullptr), Words());
     for (const auto& [line, words] : tokeniserCases) {
-        EXPECT_EQ(joined(split(line)), words) << line;
+        EXPECT_EQ(split(line), pieces(words)) << line;
     }
     const MessageRecorder messages;
     EXPECT_THROW(CommandSet::string2CommandSet("cmd x\"abc d"), DataMismatchException);
@@ -143,9 +144,9 @@ TEST(CommandSet, CopiesAreIndependent) {
     assigned = *&assigned;
     assigned.addCommand("c");
     source.resetCommand(1, source.getCommand(1));
-    EXPECT_EQ(joined(wordsOf(source)), "a|b");
-    EXPECT_EQ(joined(wordsOf(copy)), "other|b");
-    EXPECT_EQ(joined(wordsOf(assigned)), "a|b|c");
+    EXPECT_THAT(wordsOf(source), ElementsAre("a", "b"));
+    EXPECT_THAT(wordsOf(copy), ElementsAre("other", "b"));
+    EXPECT_THAT(wordsOf(assigned), ElementsAre("a", "b", "c"));
     EXPECT_THROW(source.resetCommand(2, "c"), OutOfRangeException);
 }
 
@@ -169,10 +170,10 @@ TEST(CommandSet, MovesPositionsByOne) {
         const MessageRecorder messages;
         CommandSet up = setOf(before);
         EXPECT_TRUE(up.incrementPositions() && messages.all().empty()) << before;
-        EXPECT_EQ(joined(wordsOf(up)), incremented);
+        EXPECT_EQ(wordsOf(up), pieces(incremented));
         CommandSet down = setOf(before);
         EXPECT_EQ(down.decrementPositions(), message == nullptr) << before;
-        EXPECT_EQ(joined(wordsOf(down)), decremented);
+        EXPECT_EQ(wordsOf(down), pieces(decremented));
         EXPECT_EQ(messages.info(), message != nullptr ? Words{message} : Words()) << before;
     }
     EXPECT_TRUE(CommandSet().incrementPositions() && CommandSet().decrementPositions());

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <algorithm>
+#include <cstring>
 #include <map>
 #include <optional>
 #include <string>
@@ -9,13 +10,14 @@
 
 using ModelSection = std::map<std::string, std::string>;
 
-inline std::vector<std::string> modelSplit(const std::string& text, const std::string& separator) {
+/// Null or the empty text for the separator leave the text whole.
+inline std::vector<std::string> modelSplit(const std::string& text, const char* separator) {
     std::vector<std::string> pieces;
     std::size_t begin = 0;
-    if (!separator.empty()) {
+    if (separator != nullptr && *separator != '\0') {
         for (std::size_t at = text.find(separator); at != std::string::npos; at = text.find(separator, begin)) {
             pieces.push_back(text.substr(begin, at - begin));
-            begin = at + separator.size();
+            begin = at + std::strlen(separator);
         }
     }
     pieces.push_back(text.substr(begin));
@@ -69,8 +71,8 @@ inline ModelSection modelSection(const std::string& bytes, const std::string& wa
 }
 
 /// The cell of a value; no indexes past 16 bits.
-inline std::optional<std::string> modelCell(const std::string& value, const std::string& rowSeparator, int row,
-                                            const std::string& fieldSeparator, int field) {
+inline std::optional<std::string> modelCell(const std::string& value, const char* rowSeparator, int row,
+                                            const char* fieldSeparator, int field) {
     const std::vector<std::string> rows = modelSplit(value, rowSeparator);
     if (row < 0 || static_cast<std::size_t>(row) >= rows.size()) {
         return std::nullopt;

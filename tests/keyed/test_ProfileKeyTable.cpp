@@ -1,6 +1,7 @@
 #include <climits>
-#include <tuple>
+#include <utility>
 
+#include "DataFileModel.h"
 #include "KeyedFiles.h"
 #include "MessageRecorder.h"
 
@@ -8,29 +9,27 @@ namespace {
 
 using KeyTable = KeyedFiles;
 
-TEST_F(KeyTable, FindsCellsBySeparatorsAndIndexes) {
-    m_directory.write("cells.acd", "[base]\nW = one\nTAB = a,b:c,,d:,:e\nE =\nL = x::y:z::\n");
+TEST_F(KeyTable, FindsCellsAsTheModelDoes) {
     constexpr const char* no = nullptr;
-    // A key, the separator and index of the row and of the field, the cell or null.
-    const std::tuple<const char*, const char*, short, const char*, short, const char*> cases[] = {
-        {"TAB", ":", 1, ",", 2, "d"},  {"TAB", ":", 1, ",", 1, ""},  {"TAB", ":", 2, ",", 1, ""},
-        {"TAB", ":", 3, ",", 0, "e"},  {"TAB", ":", 0, ",", 2, no},  {"TAB", ":", 4, ",", 0, no},
-        {"TAB", ":", -1, ",", 0, no},  {"TAB", ":", 0, ",", -1, no}, {"TAB", ":", 1, no, 0, "c,,d"},
-        {"TAB", ":", 1, no, 1, no},    {"TAB", no, 1, no, 0, no},    {"TAB", no, 0, no, 1, no},
-        {"TAB", no, 0, ",", 1, "b:c"}, {"TAB", ",", 1, ":", 1, "c"}, {"TAB", ",", 1, ",", 0, "b:c"},
-        {"L", "::", 1, no, 0, "y:z"},  {"L", "::", 2, no, 0, ""},    {"W", ":", 0, ",", 0, "one"},
-        {"E", ",", 0, no, 0, ""},      {"E", ",", 1, no, 0, no},     {"NONE", no, 0, no, 0, no},
-        {"w", no, 0, no, 0, no},       {"TA", ":", 0, ",", 0, no},   {"", no, 0, no, 0, no},
-        {no, ":", 0, ",", 0, no},      {"W", "", 0, "", 0, "one"},   {"W", no, 0, no, 0, "one"},
-    };
+    constexpr std::pair<const char*, const char*> separatorPairs[] = {{":", ","}, {",", ":"}, {",", ","}, {":", no},
+                                                                      {no, ","},  {no, no},   {"", ""},   {"::", no}};
+    constexpr short indexes[] = {SHRT_MIN, -1, 0, 1, 2, 3, 4, SHRT_MAX};
+    const std::string bytes = "[base]\nW = one\nTAB = a,b:c,,d:,:e\nE =\nL = x::y:z::\n";
+    m_directory.write("cells.acd", bytes);
     const auto table = openTable("cells.acd");
-    int number = 0;
-    for (const auto& [key, rowSeparator, row, fieldSeparator, field, cell] : cases) {
-        EXPECT_STREQ(table->getstringbykey(key, rowSeparator, row, fieldSeparator, field), cell) << "case " << number;
-        ++number;
+    for (const auto& [key, value] : modelSection(bytes, "base")) {
+        for (const auto& [rows, fields] : separatorPairs) {
+            for (const short row : indexes) {
+                for (const short field : indexes) {
+                    const auto expected = modelCell(value, rows, row, fields, field);
+                    const char* const cell = table->getstringbykey(key.c_str(), rows, row, fields, field);
+                    EXPECT_STREQ(cell, expected ? expected->c_str() : nullptr) << key << " " << row << " " << field;
+                }
+            }
+        }
     }
-    for (const short extreme : {short{SHRT_MIN}, short{SHRT_MAX}}) {
-        EXPECT_EQ(table->getstringbykey("TAB", ":", extreme, ",", extreme), nullptr);
+    for (const char* const absent : {"w", "TA", "", no}) {
+        EXPECT_EQ(table->getstringbykey(absent, ":", 0, ",", 0), nullptr);
     }
 }
 

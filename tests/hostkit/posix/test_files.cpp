@@ -1,6 +1,4 @@
 // What only this kind of host has: links, access rights, descriptors, limits.
-#if !defined(_WIN32)
-
 #include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/resource.h>
@@ -162,5 +160,3 @@ TEST(HkFileCopy, LeavesTheOldFileWhenThereIsNoRoom) {
 }
 
 }  // namespace
-
-#endif

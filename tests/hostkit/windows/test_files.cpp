@@ -1,6 +1,4 @@
 // What only this kind of host has: write protection of files, sharing, reparse points.
-#if defined(_WIN32)
-
 #include <gtest/gtest.h>
 #include <windows.h>
 
@@ -85,5 +83,3 @@ TEST(HkFileCopy, RefusesAProtectedDestination) {
 }
 
 }  // namespace
-
-#endif
