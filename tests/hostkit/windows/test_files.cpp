@@ -1,7 +1,9 @@
 // What only this kind of host has: write protection of files, sharing, reparse points.
 #include <gtest/gtest.h>
+#include <process.h>
 #include <windows.h>
 
+#include <filesystem>
 #include <string>
 
 #include "HkFile.h"
@@ -47,16 +49,10 @@ TEST(TreeRemoval, StopsAtReparsePoints) {
     const std::string link = directory / "tree/link";
     if (CreateSymbolicLinkA(link.c_str(), (directory / "victim").c_str(), SYMBOLIC_LINK_FLAG_DIRECTORY) == 0 ||
         !HkFile::exist(link.c_str())) {
-        char line[] = "Z:\\bin\\ln -s ../victim link";
-        STARTUPINFOA start{};
-        start.cb = sizeof start;
-        PROCESS_INFORMATION process{};
-        if (CreateProcessA(nullptr, line, nullptr, nullptr, FALSE, 0, nullptr, (directory / "tree").c_str(), &start,
-                           &process) != 0) {
-            WaitForSingleObject(process.hProcess, 10000);
-            CloseHandle(process.hThread);
-            CloseHandle(process.hProcess);
-        }
+        const std::filesystem::path former = std::filesystem::current_path();
+        std::filesystem::current_path(directory / "tree");
+        _spawnl(_P_WAIT, "Z:\\bin\\ln", "ln", "-s", "../victim", "link", nullptr);
+        std::filesystem::current_path(former);
         for (int i = 0; i < 100 && !HkFile::exist(link.c_str()); ++i) {
             Sleep(20);  // a program of the other kind is not waited for
         }
