@@ -253,12 +253,10 @@ TEST(HkCmdArgs, CompletesWhatMayComeNext) {
 }
 
 TEST(HkCmdArgs, NearestWordIsWithinAThird) {
-    const std::pair<const char*, const char*> cases[] = {
-        {"PRGORAM", "program"}, {"prog", nullptr}, {"verfiy", "verify"}, {"erify", "verify"},
-        {"xyz", nullptr},       {"er", nullptr},   {"", nullptr},        {nullptr, nullptr}};
-    const std::vector<HkString> words{"program", "verify", "erase", ""};
-    for (const auto& [word, nearest] : cases) {
-        EXPECT_STREQ(HkCmdArgs::nearest(word, words), nearest) << (word != nullptr ? word : "null");
+    const std::vector<HkString> words{"program", "verify", ""};
+    EXPECT_STREQ(HkCmdArgs::nearest("PRGORAM", words), "program");
+    for (const char* const far : {"prog", "er", "", static_cast<const char*>(nullptr)}) {
+        EXPECT_EQ(HkCmdArgs::nearest(far, words), nullptr);
     }
 }
 
