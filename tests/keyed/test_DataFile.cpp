@@ -131,7 +131,7 @@ TEST_F(DataFile, TheFirstSourceOfDirectoriesThatIsSetIsTheOnlyOne) {
     EnvironmentVariable variable("TESSAL_DATA_PATH", second.c_str());
     DeviceProfile::setDataPath((first + separator).c_str());
     EXPECT_EQ(all(), "first none");
-    DeviceProfile::setDataPath((first + separator + separator + second).c_str());
+    DeviceProfile::setDataPath((separator + first + separator + second).c_str());
     EXPECT_EQ(all(), "first two");
     DeviceProfile::setDataPath(nullptr);
     EXPECT_EQ(found("one.acd", "base"), "second");
