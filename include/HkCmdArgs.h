@@ -77,7 +77,7 @@ public:
     /// How many values were given to it, over all its places.
     int valueCount(const char* name) const;
 
-    /// A value as text. A choice and a group's words read as the format spells them.
+    /// A value as text. A choice reads as the format spells it; a group as it was given.
     const char* text(const char* name, int index = 0, const char* fallback = nullptr) const;
     /// A value as integer: decimal or, with 0x, hexadecimal, signed. The fallback where it is no such number.
     std::int64_t integer(const char* name, int index = 0, std::int64_t fallback = 0) const;
