@@ -1,6 +1,8 @@
 #include "deviceprofile/LogicalLines.h"
 
+#include <cstddef>
 #include <cstring>
+#include <limits>
 
 #include "deviceprofile/Blanks.h"
 
@@ -18,18 +20,48 @@ char* find(char* begin, const char* end, char ch) {
 struct Piece {
     char* begin;
     char* end;
-    char* next;  ///< begin of the next one
+    char* lineFeed;  ///< or the end of the text
+    char* next;      ///< begin of the next one
 };
 
 Piece pieceAt(char* begin, char* textEnd) {
     char* const lineFeed = find(begin, textEnd, '\n');
     char* const end = lineFeed != nullptr ? lineFeed : textEnd;
     const bool hasReturn = end != begin && end[-1] == '\r';
-    return {begin, end - (hasReturn ? 1 : 0), lineFeed != nullptr ? lineFeed + 1 : textEnd};
+    return {begin, end - (hasReturn ? 1 : 0), end, lineFeed != nullptr ? lineFeed + 1 : textEnd};
 }
 
 bool goesOn(const char* begin, const char* end) {
     return begin != end && end[-1] == '\\';
+}
+
+/// The same of the line that ends in this line feed, which is not the text's first.
+bool isOpenBefore(const char* lineFeed) {
+    return lineFeed[-1] == '\\' || (lineFeed[-1] == '\r' && lineFeed[-2] == '\\');
+}
+
+constexpr std::ptrdiff_t blockSize = 128;
+
+using Count = unsigned char;
+static_assert(blockSize <= std::numeric_limits<Count>::max());
+
+/// The lines that end in a block, and how many of them do not go on.
+struct LineEnds {
+    Count all;
+    Count last;
+};
+
+/// Written without branches, so that many bytes are looked at at once.
+LineEnds lineEndsIn(const char* block) {
+    const auto is = [block](std::ptrdiff_t at, char ch) -> Count { return block[at] == ch ? 1 : 0; };
+    LineEnds ends{};
+    for (std::ptrdiff_t i = 0; i < blockSize; ++i) {
+        const Count isEnd = is(i, '\n');
+        const Count isOpen = is(i - 1, '\\') | (is(i - 1, '\r') & is(i - 2, '\\'));
+        ends.all = static_cast<Count>(ends.all + isEnd);
+        ends.last = static_cast<Count>(ends.last + (isEnd & (isOpen ^ 1)));
+    }
+    return ends;
 }
 
 /// Sets a zero behind the last character that is not blank, and gives its place.
@@ -67,9 +99,17 @@ void LogicalLines::findLastPiece(LogicalLine& line) {
     std::uint32_t number = m_number;
     bool open = goesOn(line.begin, line.end);
     line.isContinued = open;
+    while (open && m_end - position > blockSize) {
+        const LineEnds ends = lineEndsIn(position);
+        if (ends.last != 0) {
+            break;
+        }
+        position += blockSize;
+        number += ends.all;
+    }
     while (open && position != m_end) {
         const Piece piece = pieceAt(position, m_end);
-        open = goesOn(piece.begin, piece.end);
+        open = isOpenBefore(piece.lineFeed);
         position = piece.next;
         ++number;
     }

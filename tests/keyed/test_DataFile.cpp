@@ -1,6 +1,9 @@
 #include <gmock/gmock.h>
 
+#include <algorithm>
 #include <fstream>
+#include <random>
+#include <regex>
 #include <sstream>
 
 #include "DataFileModel.h"
@@ -63,6 +66,30 @@ TEST_F(DataFile, OddFilesGiveTheirDumpsAndEveryPrefixReadsAsTheModelDoes) {
                 ASSERT_STREQ(valueOf(*table, key.c_str()), value.c_str()) << name << " cut at " << size << ", " << key;
             }
         }
+    }
+}
+
+TEST_F(DataFile, LongValuesOfManyLinesReadAsTheModelDoes) {
+    constexpr const char* pieces[] = {"\\\n", "\\\r\n", "x", "  ", "\\x", "\r", "words that fill a block"};
+    std::mt19937 random(1);
+    for (int round = 0; round < 1000; ++round) {
+        std::string bytes = "[base]\nA = \\\n";
+        for (auto left = random() % 200; left > 0; --left) {
+            bytes += pieces[random() % std::size(pieces)];
+        }
+        const bool isCutOff = std::regex_search(bytes, std::regex(R"(\\\r?\n?$)"));
+        const auto lines = std::count(bytes.begin(), bytes.end(), '\n');
+        std::string problem = ":2: the file ends where";
+        if (!isCutOff) {
+            bytes += round % 2 != 0 ? "\nodd" : "";
+            problem = round % 2 != 0 ? ":" + std::to_string(lines + 2) + ": neither" : "";
+        }
+        m_directory.write("long.acd", bytes);
+        const MessageRecorder messages;
+        const auto table = openTable("long.acd");
+        EXPECT_STREQ(valueOf(*table, "A"), modelSection(bytes, "base")["A"].c_str()) << bytes;
+        EXPECT_EQ(messages.info().size(), problem.empty() ? 0U : 1U) << bytes;
+        EXPECT_TRUE(problem.empty() || messages.info().at(0).find(problem) != std::string::npos) << bytes;
     }
 }
 
