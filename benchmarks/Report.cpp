@@ -12,7 +12,8 @@ constexpr const char* introduction = R"(# Benchmarks
 Each row is one operation: this library beside the fastest peer that is installed and beside the limit of the machine,
 the least work that the result needs, such as copying its bytes. The sides run in turn, round after round, in one
 process; a ratio is the median over the rounds of ours / theirs in the same round, so 0.50 means half the time. Times
-are medians in nanoseconds. Both sides' results are compared before the clock starts.
+are medians in nanoseconds. Both sides' results are compared before the clock starts. Rows below a nanosecond change by a
+quarter with the place that the linker gives their loops.
 
 This command runs all rows, and writes this page and its picture anew:
 

@@ -1,6 +1,7 @@
 // Runs the sides of one item in turn, round after round, and draws the row from what they took.
 #pragma once
 
+#include <cmath>
 #include <string>
 #include <vector>
 
@@ -19,7 +20,8 @@ struct Opponent {
     double goal = 0;  ///< 0 where not asked
 
     bool isThere() const { return !name.empty(); }
-    bool isMet() const { return !isThere() || goal == 0 || ratio <= goal; }
+    /// Compared to two digits, as goals are given and the table shows ratios.
+    bool isMet() const { return !isThere() || goal == 0 || std::round(100 * ratio) <= std::round(100 * goal); }
 };
 
 struct Row {
