@@ -1,7 +1,6 @@
 // Runs the sides of one item in turn, round after round, and draws the row from what they took.
 #pragma once
 
-#include <cmath>
 #include <string>
 #include <vector>
 
@@ -20,8 +19,7 @@ struct Opponent {
     double goal = 0;  ///< 0 where not asked
 
     bool isThere() const { return !name.empty(); }
-    /// Compared to two digits, as goals are given and the table shows ratios.
-    bool isMet() const { return !isThere() || goal == 0 || std::round(100 * ratio) <= std::round(100 * goal); }
+    bool isMet() const { return !isThere() || goal == 0 || ratio <= goal; }
 };
 
 struct Row {

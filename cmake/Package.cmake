@@ -49,8 +49,6 @@ else()
     configure_file(cmake/debian-changelog.in packaging/changelog @ONLY)
     tessal_compress(${PROJECT_BINARY_DIR}/packaging/changelog ${PROJECT_BINARY_DIR}/packaging/changelog.gz)
 
-    set(CPACK_DEBIAN_DATA_PACKAGE_ARCHITECTURE all)
-
     # The host's cache of libraries is renewed by dpkg's trigger.
     file(CONFIGURE OUTPUT packaging/triggers CONTENT "activate-noawait ldconfig\n")
     set(CPACK_DEBIAN_LIBRARY_PACKAGE_CONTROL_EXTRA ${PROJECT_BINARY_DIR}/packaging/triggers)
@@ -61,6 +59,7 @@ else()
     set(CPACK_DEBIAN_LIBRARY_PACKAGE_DEPENDS "tessalutility-data (>= ${PROJECT_VERSION})")
     tessal_debian_package(data tessalutility-data electronics
                           CONTENT "Data files: batch commands, preferences, parts and devices.")
+    set(CPACK_DEBIAN_DATA_PACKAGE_ARCHITECTURE all)
     tessal_debian_package(development libtessalutility-dev libdevel DEPENDS library
                           CONTENT "Headers, and what CMake, pkg-config and debuggers need.")
     tessal_debian_package(tools tessal-tools electronics DEPENDS library

@@ -31,12 +31,8 @@ Piece pieceAt(char* begin, char* textEnd) {
     return {begin, end - (hasReturn ? 1 : 0), end, lineFeed != nullptr ? lineFeed + 1 : textEnd};
 }
 
-bool goesOn(const char* begin, const char* end) {
-    return begin != end && end[-1] == '\\';
-}
-
-/// The same of the line that ends in this line feed, which is not the text's first.
-bool isOpenBefore(const char* lineFeed) {
+/// Whether the physical line goes on that ends here. It has a `=`, or stands behind one that has.
+bool goesOn(const char* lineFeed) {
     return lineFeed[-1] == '\\' || (lineFeed[-1] == '\r' && lineFeed[-2] == '\\');
 }
 
@@ -73,13 +69,13 @@ char* terminate(const char* begin, char* end) {
 
 }  // namespace
 
-char* joinPieces(char* begin, char* end) {
+char* joinPieces(char* begin, char* lineEnd) {
     char* joined = begin;
-    for (char* position = begin; position != end;) {
-        const Piece piece = pieceAt(position, end);
-        const bool open = goesOn(piece.begin, piece.end);
-        char* const text = skipBlanks(piece.begin, piece.end);
-        const auto length = static_cast<std::size_t>(piece.end - text) - (open ? 1 : 0);
+    for (char* position = begin; position != lineEnd;) {
+        const Piece piece = pieceAt(position, lineEnd);
+        char* const end = piece.end - (goesOn(piece.lineFeed) ? 1 : 0);
+        char* const text = skipBlanks(piece.begin, end);
+        const auto length = static_cast<std::size_t>(end - text);
         std::memmove(joined, text, length);
         joined += length;
         position = piece.next;
@@ -97,9 +93,8 @@ void LogicalLines::findLastPiece(LogicalLine& line) {
     // In locals, for what is read through a pointer to characters could be any member.
     char* position = m_position;
     std::uint32_t number = m_number;
-    bool open = goesOn(line.begin, line.end);
-    line.isContinued = open;
-    while (open && m_end - position > blockSize) {
+    bool open = true;
+    while (m_end - position > blockSize) {
         const LineEnds ends = lineEndsIn(position);
         if (ends.last != 0) {
             break;
@@ -109,11 +104,12 @@ void LogicalLines::findLastPiece(LogicalLine& line) {
     }
     while (open && position != m_end) {
         const Piece piece = pieceAt(position, m_end);
-        open = isOpenBefore(piece.lineFeed);
+        open = goesOn(piece.lineFeed);
         position = piece.next;
         ++number;
     }
     line.isCutOff = open;
+    line.end = position;
     m_position = position;
     m_number = number;
 }
@@ -129,10 +125,12 @@ bool LogicalLines::next(LogicalLine& line) {
         }
         line = LogicalLine{begin, piece.end, nullptr, m_number, false, false};
         line.equals = *begin != '[' ? find(begin, piece.end, '=') : nullptr;
-        if (line.equals != nullptr) {
+        line.isContinued = line.equals != nullptr && goesOn(piece.lineFeed);
+        if (line.isContinued) {
             findLastPiece(line);
+        } else {
+            line.end = terminate(begin, line.end);
         }
-        line.end = line.isContinued ? m_position : terminate(begin, line.end);
         return true;
     }
     return false;

@@ -18,8 +18,8 @@ struct LogicalLine {
 /// pieces and the blanks at their begins are left out. Gives the place behind the last non-blank character, where it
 /// sets a zero.
 ///
-/// @param end the line's
-char* joinPieces(char* begin, char* end);
+/// @param lineEnd the line's end
+char* joinPieces(char* begin, char* lineEnd);
 
 /// Goes through a text line by line. The text must be writable, one byte behind it too.
 ///

@@ -125,7 +125,9 @@ inline bool readingAgrees(Input input) {
     Hex2Bit::setInitValue((flags & 0x20U) != 0);
     HexModel::NumberedVec vector(length, numbering);
     for (std::size_t i = 0; i < length; ++i) {
-        (bytes[i / 8] >> i % 8 & 1) != 0 ? vector.setBit(i) : void();
+        if ((bytes[i / 8] >> i % 8 & 1) != 0) {
+            vector.setBit(i);
+        }
     }
     const std::uint32_t value = (address << 24 | digits << 16 | count << 8 | flags) >> count % 32;
     return bytesAgree(bytes, static_cast<int>(length)) && textAgrees(input.text(), static_cast<int>(count)) &&
