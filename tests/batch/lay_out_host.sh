@@ -12,7 +12,8 @@ while IFS= read -r line; do
             mkdir -p "$(dirname "$2/${line%% -> *}")"
             ln -s "${line##* -> }" "$2/${line%% -> *}"
             ;;
-        *'| '*) printf '%s\n' "${line#*| }" >>"$file" ;;
+        *'| '*) printf '%b\n' "${line#*| }" >>"$file" ;;
+        */) mkdir -p "$2/$line" ;;
         *)
             file=$2/$line
             mkdir -p "$(dirname "$file")"
