@@ -11,14 +11,7 @@
 
 #include "platform/DeviceInstaller.h"
 
-using platform::ConfigurationKind;
-using platform::DeviceClass;
-using platform::DeviceProperty;
-using platform::DeviceRecord;
-using platform::DeviceSetHandle;
-using platform::IoRange;
-using platform::Machine;
-using platform::ResourceDescriptor;
+namespace platform {
 
 struct FakeDevice {
     std::string id;
@@ -38,7 +31,7 @@ inline std::string asList(const std::vector<std::string>& texts) {
     return list + '\0';
 }
 
-class ScriptedInstaller : public platform::DeviceInstaller {
+class ScriptedInstaller : public DeviceInstaller {
 public:
     std::vector<FakeDevice> devices;
     std::vector<std::string> calls;
@@ -48,19 +41,14 @@ public:
     std::uint32_t error = 5;  ///< the host's number for that failure
     std::uint32_t classCount = 1;
     std::uint32_t pathLength = 20;
-    std::uint32_t growth = 0;      ///< bytes by which a property grows at each read
-    std::uint32_t lastDevice = 0;  ///< where an endless host ends after all
-    bool isEndless = false;        ///< more devices and descriptors for ever
-    std::string hardwareIds;       ///< of the device that was registered
+    std::uint32_t growth = 0;    ///< bytes by which a property grows at each read
+    std::uint32_t repeated = 0;  ///< so many devices in place of a set's own, with descriptors for ever
+    std::string hardwareIds;     ///< of the device that was registered
 
     /// Sets, configurations, descriptors and libraries that are open.
     int openThings() const { return m_open; }
     /// How often that was called.
     std::ptrdiff_t count(const std::string& call) const { return std::count(calls.begin(), calls.end(), call); }
-    /// What was called before that.
-    std::vector<std::string> callsBefore(const std::string& call) const {
-        return {calls.begin(), std::find(calls.begin(), calls.end(), call)};
-    }
     FakeDevice& add(FakeDevice device) { return devices.emplace_back(std::move(device)); }
 
     std::uint32_t lastError() override { return m_error; }
@@ -68,15 +56,15 @@ public:
     DeviceSetHandle createSetOnMachine(const DeviceClass* c) override { return newSet("createSetOnMachine", c); }
     DeviceSetHandle presentDevices(const DeviceClass* c, std::uint32_t flags, DeviceSetHandle former) override {
         const std::string call = "presentDevices" + nameOf(c) + " " + std::to_string(flags);
-        const bool isNew = former == platform::noDeviceSet;
+        const bool isNew = former == noDeviceSet;
         const DeviceSetHandle set = isNew ? newSet(call) : former;
         m_members.resize(devices.size());
         std::iota(m_members.begin(), m_members.end(), 0U);
-        return isNew || step(call + " into") ? set : platform::noDeviceSet;
+        return isNew || step(call + " into") ? set : noDeviceSet;
     }
     bool setDetail(DeviceSetHandle, Machine&) override { return step("setDetail"); }
     bool deviceAt(DeviceSetHandle, std::uint32_t index, DeviceRecord& device) override {
-        if (index >= (isEndless ? lastDevice : m_members.size())) {
+        if (index >= (repeated != 0 ? repeated : m_members.size())) {
             return false;
         }
         device.node = m_members[index % m_members.size()];
@@ -104,11 +92,11 @@ public:
             return false;
         }
         const bool isList = property == DeviceProperty::HardwareIds || property == DeviceProperty::CompatibleIds;
-        type = isList ? platform::listType : platform::textType;
+        type = isList ? listType : textType;
         needed = static_cast<std::uint32_t>(found->second.size()) + m_grown;
         m_grown += growth;
         if (needed > size) {
-            m_error = platform::bufferTooSmall;
+            m_error = bufferTooSmall;
             return false;
         }
         found->second.copy(buffer, size);
@@ -124,7 +112,7 @@ public:
         return step("status");
     }
     bool configuration(const DeviceRecord& device, ConfigurationKind kind, Machine,
-                       platform::LogicalConfiguration& configuration) override {
+                       LogicalConfiguration& configuration) override {
         const auto& all = devices[device.node].configurations;
         const auto found = all.find(kind);
         const bool isThere = found != all.end();
@@ -134,14 +122,14 @@ public:
     }
     bool nextIoDescriptor(std::uintptr_t previous, ResourceDescriptor& descriptor) override {
         descriptor = previous + 1;
-        return open("nextIoDescriptor", isEndless || descriptor - firstDescriptor < m_ranges.size());
+        return open("nextIoDescriptor", repeated != 0 || descriptor - firstDescriptor < m_ranges.size());
     }
     bool ioRange(ResourceDescriptor descriptor, IoRange& range) override {
         range = m_ranges[(descriptor - firstDescriptor) % m_ranges.size()];
         return step("ioRange");
     }
     void freeDescriptor(ResourceDescriptor) override { --m_open; }
-    void freeConfiguration(platform::LogicalConfiguration) override { --m_open; }
+    void freeConfiguration(LogicalConfiguration) override { --m_open; }
 
     std::uint32_t fullPath(const char* file, char* buffer, std::uint32_t size) override {
         if (!step(std::string("fullPath ") + file)) {
@@ -151,12 +139,12 @@ public:
         return pathLength;
     }
     bool setupFileClass(const char* path, DeviceClass& c, char* name, std::uint32_t size) override {
-        c = platform::cableClass;
+        c = cableClass;
         std::string("Cables").copy(name, size);
         return step(std::string("setupFileClass ") + path) && *path != '\0';
     }
     bool classOfName(const char* name, DeviceClass& c, std::uint32_t& count) override {
-        c = platform::portsClass;
+        c = portsClass;
         count = classCount;
         return step(std::string("classOfName ") + name);
     }
@@ -167,9 +155,9 @@ public:
         hardwareIds.assign(list, bytes);
         return step("storeHardwareIds");
     }
-    bool callInstaller(platform::InstallFunction function, DeviceSetHandle, DeviceRecord& device) override {
+    bool callInstaller(InstallFunction function, DeviceSetHandle, DeviceRecord& device) override {
         const bool isDone = step("callInstaller " + std::to_string(static_cast<int>(function)));
-        if (isDone && function == platform::InstallFunction::Remove) {
+        if (isDone && function == InstallFunction::Remove) {
             removed.push_back(devices[device.node].id);
         }
         return isDone;
@@ -179,22 +167,22 @@ public:
         flags = devices[device.node].flags;
         return step("installFlags");
     }
-    platform::LibraryHandle loadLibrary(const char* file) override {
+    LibraryHandle loadLibrary(const char* file) override {
         return open(std::string("loadLibrary ") + file) ? this : nullptr;
     }
-    platform::UpdateEntry findEntry(platform::LibraryHandle, const char* name) override {
+    UpdateEntry findEntry(LibraryHandle, const char* name) override {
         return step(std::string("findEntry ") + name) ? +[] {} : nullptr;
     }
-    void updateDriver(platform::UpdateEntry, const char* hardwareId, const char* path) override {
+    void updateDriver(UpdateEntry, const char* hardwareId, const char* path) override {
         step(std::string("updateDriver ") + hardwareId + " " + path);
     }
-    void freeLibrary(platform::LibraryHandle) override { --m_open; }
+    void freeLibrary(LibraryHandle) override { --m_open; }
 
 private:
     static constexpr std::uintptr_t firstDescriptor = 1000;
 
     static std::string nameOf(const DeviceClass* c) {
-        return c == nullptr ? "" : c->data1 == platform::portsClass.data1 ? " Ports" : " Cables";
+        return c == nullptr ? "" : c->data1 == portsClass.data1 ? " Ports" : " Cables";
     }
     bool step(const std::string& call) {
         calls.push_back(call);
@@ -213,7 +201,7 @@ private:
     /// An empty set.
     DeviceSetHandle newSet(const std::string& call, const DeviceClass* c = nullptr) {
         m_members.clear();
-        return open(call + nameOf(c)) ? 7 : platform::noDeviceSet;
+        return open(call + nameOf(c)) ? 7 : noDeviceSet;
     }
 
     std::vector<std::uint32_t> m_members;
@@ -222,3 +210,5 @@ private:
     std::uint32_t m_grown = 0;
     int m_open = 0;
 };
+
+}  // namespace platform

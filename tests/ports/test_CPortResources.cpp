@@ -12,6 +12,7 @@
 
 namespace {
 
+using namespace platform;
 using Names = std::vector<std::string>;
 using Addresses = std::vector<int>;
 using Kind = ConfigurationKind;
@@ -36,13 +37,13 @@ Addresses addressesOf(const PortResource* port) {
 }
 
 /// The ports of a scripted installer are those of the host while this lives.
-class CPortResourcesTest : public testing::Test, public platform::HostPorts {
+class CPortResourcesTest : public testing::Test, public HostPorts {
 protected:
-    CPortResourcesTest() { platform::replaceHostPorts(this); }
-    ~CPortResourcesTest() override { platform::replaceHostPorts(nullptr); }
-    platform::HostPortList list(const std::string&) override {
+    CPortResourcesTest() { replaceHostPorts(this); }
+    ~CPortResourcesTest() override { replaceHostPorts(nullptr); }
+    HostPortList list(const std::string&) override {
         ++listings;
-        return platform::installedPorts(installer);
+        return installedPorts(installer);
     }
 
     FakeDevice& add(const std::string& text) { return installer.add({"", {{DeviceProperty::FriendlyName, text}}}); }
@@ -91,28 +92,9 @@ TEST_F(CPortResourcesTest, SearchesByFamilyAndByName) {
     EXPECT_EQ(listings, 1);
 }
 
-TEST(PortResource, CutsTextsThatAreTooLong) {
-    PortResource port;
-    port.setPortDisplayName(std::string(500, 'd').c_str());
-    port.setPortName(std::string(500, 'n').c_str());
-    EXPECT_EQ(std::string(port.getPortDisplayName()), std::string(63, 'd'));
-    EXPECT_EQ(std::string(port.getPortName()), std::string(15, 'n'));
-    EXPECT_EQ(addressesOf(&port), (Addresses{-1, -1, -1, -1}));
-    port.setPortName(nullptr);
-    EXPECT_STREQ(port.getPortName(), "");
-}
-
 TEST(CPortResources, ExtractsTheShortName) {
     const std::pair<const char*, const char*> cases[] = {
-        {"Printer Port (LPT1)", "LPT1"},
-        {"Communications Port (COM3)", "COM3"},
-        {"(COM12)", "COM1"},
-        {"(COM1) (LPT2)", "LPT2"},
-        {"(com1)", "(COM"},
-        {"USB device", "(COM"},
-        {"cut (LPT", "LPT"},
-        {"", "(COM"},
-        {nullptr, "(COM"},
+        {"(COM1) (LPT2)", "LPT2"}, {"(com1)", "(COM"}, {"cut (LPT", "LPT"}, {"", "(COM"}, {nullptr, "(COM"},
     };
     for (const auto& [text, name] : cases) {
         EXPECT_STREQ(CPortResources::extractPortName(text), name);
@@ -135,7 +117,6 @@ TEST_F(CPortResourcesTest, PicksTheConfigurationAndStoresRangesInTurn) {
         {"troubled", 0x400, 10, {{Kind::Allocated, {{8, 9}}}, {Kind::Boot, one}}, {1, 2, -1, -1}},
         {"disabled", 0x400, 29, {{Kind::Boot, one}}, {-1, -1, -1, -1}, "No resources.\n"},
         {"disabled, forced", 0x400, 29, {{Kind::Forced, one}}, {1, 2, -1, -1}},
-        {"none", 0, 0, {}, {-1, -1, -1, -1}, "No resources.\n"},
         {"no range", 0, 0, {{Kind::Allocated, {}}}, {-1, -1, -1, -1}},
         {"size 0", 0, 0, {{Kind::Allocated, {{0, ULLONG_MAX}, {5, 4}, {3, 6}}}}, {3, 6, -1, -1}},
         {"third", 0, 0, {{Kind::Allocated, {{1, 2}, {3, 4}, {0xF00000005, 6}}}}, {5, 6, 3, 4}},
@@ -178,7 +159,7 @@ TEST_F(CPortResourcesTest, EachFailureOfTheHostLeavesAShorterList) {
     }
 }
 
-TEST_F(CPortResourcesTest, ReadsTextsOfAnyKind) {
+TEST_F(CPortResourcesTest, ReadsTextsOfAnyKindAndCutsThemToTheirFields) {
     const std::map<Kind, std::vector<IoRange>> configurations{{Kind::Allocated, {{1, 2}}}};
     add("first (COM1)");
     installer.add({"", {}, configurations});  // is no port for the user
@@ -187,7 +168,12 @@ TEST_F(CPortResourcesTest, ReadsTextsOfAnyKind) {
     CPortResources ports = listed("No resources.\nNo resources.\n");
     EXPECT_EQ(namesOf(ports, "COM"), (Names{"COM1", "COM2", "COM3"}));
     EXPECT_EQ(addressesOf(ports.getPortResource("COM1")), (Addresses{-1, -1, -1, -1}));
-    EXPECT_EQ(std::string(ports.getPortResource("COM3")->getPortDisplayName()), std::string(63, 'x'));
+    PortResource* const port = ports.getPortResource("COM3");
+    EXPECT_EQ(std::string(port->getPortDisplayName()), std::string(63, 'x'));
+    port->setPortName(std::string(500, 'n').c_str());
+    EXPECT_EQ(std::string(port->getPortName()), std::string(15, 'n'));
+    port->setPortName(nullptr);
+    EXPECT_STREQ(port->getPortName(), "");
 }
 
 TEST_F(CPortResourcesTest, AHostThatNeverComesToAnEndIsStopped) {
@@ -198,13 +184,12 @@ TEST_F(CPortResourcesTest, AHostThatNeverComesToAnEndIsStopped) {
     EXPECT_EQ(installer.count("property 12"), 16);
     installer.calls.clear();
     installer.growth = 0;
-    installer.isEndless = true;
-    installer.lastDevice = 2;
+    installer.repeated = 2;
     listed();
     EXPECT_EQ(installer.count("nextIoDescriptor"), 2 * 1024);
     device.properties[DeviceProperty::FriendlyName] = "(COM1)";
     device.configurations.clear();
-    installer.lastDevice = 1U << 20;
+    installer.repeated = 1U << 20;
     testing::internal::CaptureStdout();
     CPortResources ports;
     testing::internal::GetCapturedStdout();

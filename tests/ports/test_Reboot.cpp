@@ -55,12 +55,6 @@ private:
     }
 };
 
-std::string outputOfReboot() {
-    testing::internal::CaptureStdout();
-    Reboot();
-    return testing::internal::GetCapturedStdout();
-}
-
 TEST(Reboot, GoesStepByStepAndEndsAtANo) {
     const std::string privilege = "SeShutdownPrivilege";
     const std::string leave = "exit 6 0";
@@ -80,32 +74,11 @@ TEST(Reboot, GoesStepByStepAndEndsAtANo) {
         ScriptedRestart host;
         host.failing = failing;
         host.error = error;
-        EXPECT_EQ(outputOfReboot(), failing == Texts{leave} ? "ExitWindowsEx Error.\n" : "");
+        testing::internal::CaptureStdout();
+        Reboot();
+        EXPECT_EQ(testing::internal::GetCapturedStdout(), failing == Texts{leave} ? "ExitWindowsEx Error.\n" : "");
         EXPECT_EQ(host.calls, calls);
         EXPECT_EQ(host.openTokens, 0);
-    }
-}
-
-TEST(Reboot, UsesTheCallersRestarter) {
-    struct Restarter : SystemRestarter {
-        Texts calls;
-        bool confirm(const char* text, const char* caption) override {
-            calls.push_back(std::string(caption) + ": " + text);
-            return true;
-        }
-        bool restart() override { return false; }
-    } restarter;
-    ScriptedRestart host;
-    setSystemRestarter(&restarter);
-    EXPECT_EQ(outputOfReboot(), "ExitWindowsEx Error.\n");
-    setSystemRestarter(nullptr);
-    EXPECT_EQ(restarter.calls, (Texts{std::string(title) + ": " + first, std::string(title) + ": " + second}));
-    EXPECT_EQ(host.calls, Texts());
-}
-
-TEST(Reboot, DoesNothingOnAHostWithoutARestart) {
-    if (platform::systemRestart() == nullptr) {
-        EXPECT_EQ(outputOfReboot(), "");
     }
 }
 
