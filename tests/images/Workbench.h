@@ -8,6 +8,7 @@
 #include <random>
 #include <regex>
 #include <string>
+#include <tuple>
 
 #include "CommandSet.h"
 #include "M2IUtil_Data_Utils.h"
@@ -23,17 +24,16 @@ inline std::string noise(std::size_t count, unsigned seed = 1) {
     return result;
 }
 
-/// What the reader tells of an object file or memory text.
-struct SectionRange {
-    M2IUtil_BramMapping::M2IUtil_Results result{};
-    unsigned int lowest = 1;
-    unsigned int highest = 1;
+/// The reader's result for an object file or memory text, the lowest address, and the one behind the last byte.
+using SectionRange = std::tuple<M2IUtil_BramMapping::M2IUtil_Results, unsigned int, unsigned int>;
 
-    explicit SectionRange(const std::string& path) {
-        const M2IUtil_Data_Utils reader(path.c_str(), DUMP_BY_DEFAULT, &result);
-        reader.GetProgramSectionAddressRange(&lowest, &highest);
-    }
-};
+inline SectionRange sectionRange(const std::string& path) {
+    SectionRange range{{}, 1, 1};
+    auto& [result, lowest, highest] = range;
+    const M2IUtil_Data_Utils reader(path.c_str(), DUMP_BY_DEFAULT, &result);
+    reader.GetProgramSectionAddressRange(&lowest, &highest);
+    return range;
+}
 
 class Workbench : public TemporaryDirectory {
 public:

@@ -1,7 +1,12 @@
-// The generator beside its examples: progress, a failure midway, its argument format.
+// The generator: every command of the documents with examples, progress, a failure midway, its argument format.
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+
+#include <fstream>
+#include <optional>
+#include <regex>
+#include <sstream>
 
 #include "DataPath.h"
 #include "HkFile.h"
@@ -11,6 +16,83 @@
 #include "images/Workbench.h"
 
 namespace {
+
+/// One block: data files, or directories, and commands on them, each with what it says and the files that it leaves.
+class Block {
+public:
+    void readLine(const std::string& line) {
+        if (line.rfind("$ generate ", 0) == 0) {
+            runCommand();
+            m_command = std::regex_replace(line.substr(11), std::regex("-data "), "-data @");
+        } else if (m_command.empty()) {
+            makeFile(line);
+        } else if (line.rfind("> ", 0) == 0) {
+            m_files.emplace_back(line.substr(2), "");
+        } else {
+            (m_files.empty() ? m_said : m_files.back().second) += line + '\n';
+        }
+    }
+
+    /// Runs the last command that was read, and forgets it.
+    void runCommand() {
+        SCOPED_TRACE(m_command);
+        const auto before = m_bench.content();
+        const bool isDone = m_command.empty() || m_bench.generate(m_command);
+        const std::size_t end = m_said.find("...\n");  // the rest of such a text is the host's
+        EXPECT_EQ(m_bench.said().substr(0, end), m_said.substr(0, end));
+        EXPECT_TRUE(isDone || m_bench.content() == before) << "refused, but the files are others";
+        for (const auto& [name, expected] : m_files) {
+            const std::string file = m_bench.read(name);
+            const bool isText = !file.empty() && file.back() == '\n';
+            EXPECT_EQ(file + (isText ? "" : "\n"), expected) << name;
+        }
+        m_said.clear();
+        m_files.clear();
+    }
+
+private:
+    /// From "a = 1F 2E", "a "text"" or "a/".
+    void makeFile(const std::string& line) {
+        std::smatch parts;
+        std::regex_match(line, parts, std::regex("(\\S+)(?: = (.*)| \"(.*)\")?"));
+        const std::string name = parts[1];
+        std::string bytes = parts[3];
+        std::istringstream digits(parts[2]);
+        for (unsigned byte = 0; digits >> std::hex >> byte;) {
+            bytes += static_cast<char>(byte);
+        }
+        name.back() == '/' ? m_bench.make(name) : m_bench.write(name, bytes);
+    }
+
+    Workbench m_bench;
+    std::string m_command;
+    std::string m_said;
+    std::vector<std::pair<std::string, std::string>> m_files;
+};
+
+void runDocument(const char* path, int blocks) {
+    DeviceProfile::setDataPath(TEST_DATA_DIR "/prom");
+    std::ifstream document(path);
+    std::optional<Block> block;
+    int count = 0;
+    for (std::string line; std::getline(document, line);) {
+        if (line == "```prom") {
+            block.emplace();
+            ++count;
+        } else if (block && line == "```") {
+            block->runCommand();
+            block.reset();
+        } else if (block) {
+            block->readLine(line);
+        }
+    }
+    EXPECT_EQ(count, blocks) << path;
+}
+
+TEST(Documents, AreTrue) {
+    runDocument(SHIPPED_DATA_DIR "/../docs/prom-files.md", 2);
+    runDocument(TEST_DATA_DIR "/images/cases.md", 6);
+}
 
 std::vector<std::string> reports;
 std::string lastFile;
@@ -60,15 +142,10 @@ TEST_F(Generator, WithoutACommandThereIsNothingToDo) {
     EXPECT_FALSE(PromUtility::generate(nullptr));
 }
 
-TEST_F(Generator, HasTheFormatOfTheShippedCommandAndTakesWhatTheOptionRowsMake) {
+TEST_F(Generator, HasTheFormatOfTheShippedCommand) {
     DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
     TessalCmdargs::createCommandMap();
     EXPECT_STREQ(TessalCmdargs::findFormatString("generate"), IF_IMAGEGEN::getcmdformat());
-    const char* const words[] = {
-        "generate", "",    "-active",    "c",  "-path",        "out",      "-output",    "o", "-compressed",
-        "-format",  "hex", "-fillValue", "FF", "-disableswap", "-generic", "-multiboot", ""};
-    const HkCmdArgs args(17, words, IF_IMAGEGEN::getcmdformat(), nullptr, HkCmdArgs::Quiet);
-    EXPECT_EQ(args.iserror(), 0) << (args.errors().empty() ? "" : args.errors()[0].c_str());
 }
 
 }  // namespace

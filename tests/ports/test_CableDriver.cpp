@@ -70,8 +70,6 @@ TEST_F(CableDriver, PatternsChooseDevices) {
         {{"*"}, both},
         {{"'*"}, {}},
         {{}, both},
-        {{"*", "nothing"}, both},
-        {{"=Ports"}, both, {"classOfName Ports", "presentDevices Ports 2"}},
         {{"=Ports", "oth*"}, {"ROOT\\B\\0"}, {"classOfName Ports", "presentDevices Ports 2"}},
         {{"=Ports", "*", "@gone"}, both, {"classOfName Ports", "presentDevices Ports 2", "openDevice gone"}},
         {{"=Ports", "@ROOT\\A\\0"},

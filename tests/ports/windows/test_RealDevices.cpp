@@ -5,8 +5,6 @@
 // What follows needs the one above.
 #include <setupapi.h>
 
-#include <algorithm>
-#include <cstdio>
 #include <string>
 #include <vector>
 
@@ -78,7 +76,6 @@ protected:
 };
 
 TEST_F(RealDevices, ARegisteredPortIsFoundByItsPatterns) {
-    EXPECT_EQ(chosen({hardwareId}), Texts());
     registerPort();
     const Texts port{friendlyName};
     for (const char* const pattern : {hardwareId, "tessal\\TEST*", "@root\\ports\\*", "*\\testport"}) {
