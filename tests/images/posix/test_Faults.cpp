@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 #include <signal.h>
 #include <sys/resource.h>
+#include <sys/stat.h>
 
 #include <algorithm>
 #include <filesystem>
@@ -39,15 +40,16 @@ TEST(Faults, AFullDiskLeavesTheOldFilesAndNoHalfOnes) {
     ::signal(SIGXFSZ, former);
 }
 
-TEST(Faults, ADeviceIsNeitherReadNorReplaced) {
+TEST(Faults, WhatIsNoPlainFileIsNeitherReadNorReplaced) {
     Workbench bench;
     bench.write("a", "abc");
-    std::filesystem::create_symlink("/dev/full", bench / "p.mcs");
+    ASSERT_EQ(::mkfifo((bench / "pipe").c_str(), 0600), 0);
+    std::filesystem::create_symlink("pipe", bench / "p.mcs");
     EXPECT_FALSE(bench.generate("-generic -output p -data @a"));
     EXPECT_THAT(bench.said(), testing::HasSubstr("p.mcs: cannot be made or replaced: Invalid argument"));
     EXPECT_FALSE(bench.generate("-generic -output q -data /dev/zero"));
     EXPECT_THAT(bench.said(), testing::HasSubstr("/dev/zero: is no plain file"));
-    EXPECT_TRUE(std::filesystem::is_symlink(bench / "p.mcs"));
+    EXPECT_TRUE(std::filesystem::is_fifo(bench / "p.mcs"));
 }
 
 }  // namespace
