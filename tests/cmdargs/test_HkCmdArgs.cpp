@@ -1,116 +1,151 @@
+// The parser against the blocks of docs/argument-format.md and tests/data/cmdargs/cases.md, and what no block can show.
+
 #include "HkCmdArgs.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <fstream>
+#include <iomanip>
+#include <sstream>
 #include <string>
 #include <tuple>
-#include <utility>
 #include <vector>
 
 #include "MessageRecorder.h"
-#include "cmdargs/Dump.h"
 
 namespace {
 
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::SizeIs;
+using Lines = std::vector<std::string>;
 
-constexpr const char* program =
-    "'Programs devices.' -p|-position <device=int 1..255>... 'device positions' [-e|-erase 'erase first'] "
-    "[-format <mcs|exo|tek>] [-ver <revision=group 0|1 rp code*>]... [{-fast -slow}] [<file> 'the device''s image']";
-const std::string usageLine =
-    "usage: program -p|-position <device>... [-e|-erase] [-format <mcs|exo|tek>] [-ver <revision>]... [-fast | -slow] "
-    "[<file>]\n";
-
-int calls = 0;
-void countCall() {
-    ++calls;
+/// Splits at blanks; double quotes round a word hold it together.
+Lines splitCommand(const std::string& line) {
+    Lines words;
+    std::istringstream in(line);
+    for (std::string word; in >> std::quoted(word);) {
+        words.push_back(word);
+    }
+    return words;
 }
 
-// The blocks of docs/argument-format.md hold formats, commands, and what these give.
-TEST(HkCmdArgs, GivesWhatTheDocumentShows) {
-    std::ifstream file(SHIPPED_DATA_DIR "/../docs/argument-format.md");
-    Lines shown;
-    Lines given;
-    std::string format;
-    bool inside = false;
-    for (std::string line; std::getline(file, line);) {
-        line.erase(line.find_last_not_of(" \r") + 1);
-        if (line.rfind("```", 0) == 0) {
-            inside = line == "```args";
-        } else if (inside) {
-            const bool isCommand = line.rfind("$ ", 0) == 0;
-            const bool isFormat = line.rfind("format ", 0) == 0;
-            format = isFormat ? line.substr(7) : format;
-            shown.push_back(line);
-            given.insert(given.end(), isCommand || isFormat ? 1 : 0, line);
-            const Lines results = isCommand ? parse(format.c_str(), line.substr(2)) : Lines();
-            given.insert(given.end(), results.begin(), results.end());
+/// The words as a program gets them; they live as long as @p words.
+std::vector<const char*> pointersTo(const Lines& words) {
+    std::vector<const char*> pointers(words.size());
+    std::transform(words.begin(), words.end(), pointers.begin(), [](const std::string& word) { return word.c_str(); });
+    return pointers;
+}
+
+HkCmdArgs parsed(const char* format, const Lines& words, unsigned short flags = HkCmdArgs::Quiet,
+                 void (*callback)() = nullptr) {
+    return HkCmdArgs(static_cast<int>(words.size()), pointersTo(words).data(), format, callback, flags);
+}
+
+std::string groupDump(const HkCmdArgs& args, const HkCmdArgInfo& info, const char* format, int index) {
+    std::string text = "{" + std::string(args.groupLeader(info.names[0], index).view());
+    // The members are not part of the description: ask for each word that the format holds.
+    for (const std::string& word : splitCommand(format)) {
+        const std::string member = word.substr(0, word.find_first_of("*>"));
+        if (args.groupHas(info.names[0], member.c_str(), index) && text.find(" " + member) == std::string::npos) {
+            const bool hasText = word.find('*') != std::string::npos;
+            const std::string carried(args.groupText(info.names[0], member.c_str(), index).view());
+            text += " " + member + (hasText ? "(" + carried + ")" : "");
         }
     }
-    EXPECT_GT(shown.size(), 80U);
-    EXPECT_EQ(given, shown);
+    return text + "}";
 }
 
-TEST(HkCmdArgs, MalformedFormatsTellPlaceAndReason) {
-    const std::pair<const char*, const char*> cases[] = {
-        {"-p <n=itn>", "character 4: unknown type itn"},
-        {"-p <n=int 5..1>", "character 4: expected a range such as 1..255, not 5..1"},
-        {"-p <hex 0>", "character 4: expected a range such as 1..255, not 0"},
-        {"-p <n=int 1..2 3>", "character 4: unexpected 3"},
-        {"-p <group |>", "character 4: expected the first words of the group, such as group 0|1 rp wp"},
-        {"-p <>", "character 4: expected a name or a type between < and >"},
-        {"-p <a b=int>", "character 4: expected <name=type>"},
-        {"-p <n", "character 4: the argument has no closing >"},
-        {"<-n>", "character 1: the name of an argument begins with no dash"},
-        {"[-p)", "character 4: expected ]"},
-        {"(-p]", "character 4: expected )"},
-        {"{-p -q", "character 1: expected } behind at least two arguments"},
-        {"[]", "character 2: expected a -switch, a \"word\" or an <argument>"},
-        {"-p --", "character 4: expected the name of a switch, a dash and letters"},
-        {"-p [-P]", "character 5: the name -p stands twice"},
-        {"<file> \"FILE\"", "character 8: the name file stands twice"},
-        {"\"up", "character 1: the word has no closing \""},
-        {"-p 'help", "character 4: the help text has no closing '"},
-        {"[-p 'a'] 'b'", "character 10: a second help text"},
-        {"[<a>] <b>", "character 7: the required <b> stands behind an optional one"},
-        {"<a>... [<b>]", "character 9: no argument can follow the list before <b>"},
-        {"-p 'a, b'", "character 6: the characters comma and colon cannot stand in a format"},
-    };
-    for (const auto& [format, error] : cases) {
-        const std::string expected = std::string("the argument format is malformed at ") + error;
-        EXPECT_EQ(HkCmdArgs::checkFormat(format), expected.c_str()) << format;
-        EXPECT_THAT(parse(format, "cmd -p 1"), ElementsAre("! " + expected)) << format;
-        EXPECT_EQ(HkCmdArgs::help("cmd", format), "usage: cmd\n") << format;
+std::string dumpOne(const HkCmdArgs& args, const HkCmdArgInfo& info, const char* format) {
+    const char* const name = info.names[0];
+    std::string line = *name != '\0' ? name : "\"\"";
+    if (args.count(name) > 1 && info.kind != HkCmdArgInfo::Kind::Positional) {
+        line += " x" + std::to_string(args.count(name));
     }
-    for (const char* const format : {program, "", " \t -a|\n-b\r\n[ -c [ < n = int 1.. > ] ] "}) {
-        EXPECT_TRUE(HkCmdArgs::checkFormat(format).IsEmpty()) << format;
+    for (int i = 0; i < args.valueCount(name); ++i) {
+        const bool isGroup = info.type == HkCmdArgInfo::Type::Group;
+        line += i == 0 ? " = " : " ";
+        line += isGroup ? groupDump(args, info, format, i) : args.text(name, i);
     }
+    return line;
 }
 
-TEST(HkCmdArgs, ValuesAtTheEdgesOfTheirTypes) {
-    const std::tuple<const char*, Lines, Lines> cases[] = {
-        {"<n=int>",
-         {"-9223372036854775808", "0x7FFFFFFFFFFFFFFF", "+1"},
-         {"-9223372036854775809", "9223372036854775808", "0x", "-", " 1", "1 "}},
-        {"<n=int ..-2>", {"-2"}, {"-1"}},
-        {"<n=int 3>", {"3"}, {"4"}},
-        {"<n=hex 8>", {"0x0123abCD"}, {"123abCD"}},
-        {"<n=hex>", {"0123456789abcdef0123456789ABCDEF"}, {"12g", "0x"}},
-        {"<n=text 2..>", {"ab"}, {"a"}},
-        {"<n=a|b|>", {"B"}, {"", "c"}},
-        {"<n=group a|b c* d>", {" A  d  c:x:y d"}, {"", "c:x", "a c", "a d:"}},
-    };
-    for (const auto& [format, fitting, unfit] : cases) {
-        for (const Lines* const values : {&fitting, &unfit}) {
-            for (const std::string& value : *values) {
-                const bool isFitting = parsed(format, {"cmd", "--", value}).iserror() == 0;
-                EXPECT_EQ(isFitting, values == &fitting) << format << " " << value;
+/// The errors, each behind "! "; without errors what was given, in the order of the command.
+Lines dump(const HkCmdArgs& args, const char* format) {
+    Lines lines;
+    for (const HkString& error : args.errors()) {
+        lines.push_back("! " + std::string(error.view()));
+    }
+    if (!lines.empty()) {
+        return lines;
+    }
+    const std::vector<HkCmdArgInfo> infos = HkCmdArgs::describe(format);
+    for (const HkString& name : args.order()) {
+        const auto info =
+            std::find_if(infos.begin(), infos.end(), [&](const auto& one) { return one.names[0] == name; });
+        const std::string line = dumpOne(args, *info, format);
+        if (std::find(lines.begin(), lines.end(), line) == lines.end()) {
+            lines.push_back(line);
+        }
+    }
+    return lines;
+}
+
+/// What a command line gives.
+Lines parse(const char* format, const std::string& line) {
+    return dump(parsed(format, splitCommand(line)), format);
+}
+
+/// A line of a block and what it gives: a format its fault, a command its dump, a part of a command the words that may
+/// stand in the place of its last one, a command word its help. Any other line is such an answer and gives nothing.
+std::string asked(const std::string& line, std::string& format) {
+    const std::size_t blank = std::min(line.find(' '), line.size());
+    const std::string question = line.substr(0, blank);
+    const std::string rest = line.substr(std::min(blank + 1, line.size()));
+    std::ostringstream answer;
+    answer << line << '\n';
+    if (question == "format") {
+        format = rest;
+        const HkString fault = HkCmdArgs::checkFormat(format.c_str());
+        answer << (fault.IsEmpty() ? "" : "! ") << fault << (fault.IsEmpty() ? "" : "\n");
+    } else if (question == "$") {
+        for (const std::string& result : parse(format.c_str(), rest)) {
+            answer << result << '\n';
+        }
+    } else if (question == "?") {
+        const Lines words = splitCommand(rest);
+        for (const HkString& next :
+             HkCmdArgs::complete(static_cast<int>(words.size()), pointersTo(words).data(), format.c_str())) {
+            answer << next << '\n';
+        }
+    } else if (question == "help") {
+        answer << HkCmdArgs::help(rest.c_str(), format.c_str());
+    } else {
+        return "";
+    }
+    return answer.str();
+}
+
+TEST(HkCmdArgs, GivesWhatTheDocumentsShow) {
+    for (const char* const path : {SHIPPED_DATA_DIR "/../docs/argument-format.md", TEST_DATA_DIR "/cmdargs/cases.md"}) {
+        std::ifstream file(path);
+        std::string shown;
+        std::string given;
+        std::string format;
+        bool inside = false;
+        for (std::string line; std::getline(file, line);) {
+            line.erase(line.find_last_not_of(" \r") + 1);
+            if (line.rfind("```", 0) == 0) {
+                inside = line == "```args";
+            } else if (inside) {
+                shown += line + '\n';
+                given += asked(line, format);
             }
         }
+        EXPECT_THAT(shown, SizeIs(testing::Gt(3000U))) << path;
+        EXPECT_EQ(given, shown) << path;
     }
 }
 
@@ -132,35 +167,27 @@ TEST(HkCmdArgs, ReadsTypedValues) {
     EXPECT_FALSE(args.groupHas("-n", "abc"));
 }
 
-TEST(HkCmdArgs, ReportsEachErrorAsInfoThenTheUsageLine) {
-    const MessageRecorder recorder;
-    calls = 0;
-    const HkCmdArgs args =
-        parsed(program, splitCommand("program -erse x -format mcx -fast -slow -f -e=1 -E"), 0, &countCall);
-    EXPECT_THAT(recorder.info(),
-                ElementsAre("program: unknown switch \"-erse\"; did you mean -erase?\n",
-                            "program: -format needs one of mcs, exo, tek, not \"mcx\"; did you mean mcs?\n",
-                            "program: switch \"-f\" is short for -format or -fast: write more of it\n",
-                            "program: -e|-erase takes no value, but was given \"1\"\n",
-                            "program: -e|-erase is given more than once\n",
-                            "program: -p|-position <device>... is missing: device positions\n",
-                            "program: -fast and -slow exclude each other\n", usageLine));
-    EXPECT_EQ(recorder.all().front().file, "../s/HkCmdArgs");
-    EXPECT_EQ(calls, 1);
-    EXPECT_THAT(args.errors(), SizeIs(7));
-    EXPECT_TRUE(args.isGiven("-fast")) << "what was understood can be read";
+int calls = 0;
+void countCall() {
+    ++calls;
 }
 
-TEST(HkCmdArgs, FlagsAndCallback) {
-    const MessageRecorder recorder;
+TEST(HkCmdArgs, ReportsErrorsAndTheUsageLineAsTheFlagsSay) {
+    MessageRecorder recorder;
     calls = 0;
     const Lines words{"cmd", "-pos", "1"};
     EXPECT_EQ(parsed("-position <int>", words, 0, &countCall).iserror() + calls, 0);
     parsed("-position <int>", words, HkCmdArgs::NoAbbreviation | HkCmdArgs::Quiet, &countCall);
     EXPECT_EQ(calls, 1);
     EXPECT_TRUE(recorder.all().empty());
-    parsed("", words, HkCmdArgs::NoUsage);
-    EXPECT_THAT(recorder.info(), ElementsAre("cmd: unknown switch \"-pos\"\n"));
+    const HkCmdArgs args = parsed("-pos -x", words, HkCmdArgs::NoUsage);
+    EXPECT_THAT(recorder.info(), ElementsAre("cmd: unexpected argument \"1\"\n", "cmd: -x is missing\n"));
+    EXPECT_TRUE(args.isGiven("-pos")) << "what was understood can be read";
+    recorder.clear();
+    parsed("[-x]", words, 0, &countCall);
+    EXPECT_THAT(recorder.info(), ElementsAre("cmd: unknown switch \"-pos\"\n", "usage: cmd [-x]\n"));
+    EXPECT_EQ(recorder.all().front().file, "../s/HkCmdArgs");
+    EXPECT_EQ(calls, 2);
 }
 
 TEST(HkCmdArgs, BadCallsAreErrors) {
@@ -177,7 +204,7 @@ TEST(HkCmdArgs, BadCallsAreErrors) {
         EXPECT_EQ(dump(args, format), errors);
         EXPECT_THAT(args.usage().c_str(), HasSubstr("usage: "));
     }
-    EXPECT_TRUE(HkCmdArgs::complete(1, holes, program).empty());
+    EXPECT_TRUE(HkCmdArgs::complete(1, holes, "[-p]").empty());
     EXPECT_TRUE(HkCmdArgs::describe(nullptr).empty());
 }
 
@@ -207,49 +234,6 @@ TEST(HkCmdArgs, HundredThousandSwitchesAndFormatsBeyondTheCache) {
         ASSERT_THAT(parse(name.c_str(), "cmd " + name), ElementsAre(name));
     }
     EXPECT_THAT(parse(("-p '" + std::string(1 << 20, 'h') + "'").c_str(), "cmd -p"), ElementsAre("-p"));
-}
-
-TEST(HkCmdArgs, HelpSaysWhatEachArgumentIs) {
-    EXPECT_EQ(HkCmdArgs::help("program", program).view(),
-              usageLine +
-                  "\n"
-                  "Programs devices.\n"
-                  "\n"
-                  "  -p|-position <device>...  device positions (an integer from 1 to 255)\n"
-                  "  -e|-erase                 erase first\n"
-                  "  -format <mcs|exo|tek>     one of mcs, exo, tek\n"
-                  "  -ver <revision>           one argument of the form \"0|1 [rp] [code:<text>]\"\n"
-                  "  -fast\n"
-                  "  -slow\n"
-                  "  <file>                    the device's image (a file name)\n");
-    EXPECT_EQ(HkCmdArgs::usage(nullptr, "(-a)... {\"\" <b>...} -c [<int>...]"),
-              "usage:  (-a)... {\"\" | <b>...} -c [<int>...]");
-    EXPECT_EQ(HkCmdArgs::help("c", "-an-unusually-long-name|-alias <value> 'help' -b"),
-              "usage: c -an-unusually-long-name|-alias <value> -b\n\n"
-              "  -an-unusually-long-name|-alias <value>\n      help\n  -b\n");
-}
-
-TEST(HkCmdArgs, CompletesWhatMayComeNext) {
-    const char* const words = "[\"all\"] [<on|off>]";
-    const std::tuple<const char*, const char*, const char*, Lines> cases[] = {
-        {program, "program", "-", {"-p", "-position", "-e", "-erase", "-format", "-ver", "-fast", "-slow"}},
-        {program, "program", "-F", {"-format", "-fast"}},
-        {program, "program -e -fast", "", {"-p", "-position", "-format", "-ver"}},
-        {program, "program -p", "", {}},
-        {program, "program -format", "E", {"exo"}},
-        {program, "program", "-format=t", {"-format=tek"}},
-        {program, "program", "-x=t", {}},
-        {program, "program -ver 0 -ver", "", {"0", "1"}},
-        {program, "program --", "-", {}},
-        {words, "cmd", "o", {"on", "off"}},
-        {words, "cmd on", "", {"all"}},
-    };
-    for (const auto& [format, line, partial, expected] : cases) {
-        Lines given = splitCommand(line);
-        given.emplace_back(partial);
-        const auto found = HkCmdArgs::complete(static_cast<int>(given.size()), pointersTo(given).data(), format);
-        EXPECT_EQ(Lines(found.begin(), found.end()), expected) << line << " " << partial;
-    }
 }
 
 TEST(HkCmdArgs, NearestWordIsWithinAThird) {
