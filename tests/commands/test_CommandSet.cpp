@@ -3,9 +3,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <cstring>
 #include <memory>
-#include <sstream>
 #include <string>
 #include <tuple>
 #include <utility>
@@ -28,69 +28,43 @@ Words wordsOf(const CommandSet& commands) {
     return words;
 }
 
+/// The set of a line's tokens, which has at least one.
+CommandSet setOf(const char* line) {
+    return *std::unique_ptr<CommandSet>(CommandSet::string2CommandSet(line));
+}
+
 Words split(const char* line) {
     const std::unique_ptr<CommandSet> commands(CommandSet::string2CommandSet(line));
     return commands != nullptr ? wordsOf(*commands) : Words();
 }
 
-/// The words between the bars; none in the empty text.
-Words pieces(const std::string& text) {
-    Words words;
-    std::istringstream in(text.empty() ? text : text + "|");
-    for (std::string word; std::getline(in, word, '|');) {
-        words.push_back(word);
-    }
-    return words;
-}
-
-CommandSet setOf(const std::string& text) {
-    CommandSet commands;
-    for (const std::string& word : pieces(text)) {
-        commands.addCommand(word.c_str());
-    }
-    return commands;
-}
-
-// Comments and separators; quotations, before which letters are dropped and behind which they are a token of their own;
-// empty quotations, which are a token behind dropped letters only, and never the command word.
-const std::pair<const char*, const char*> tokeniserCases[] = {
-    {"", ""},         {"a\"\" cmd", "cmd"},         {"a\vb\fc\x01", "a\vb\fc\x01"},
-    {"\"\"", ""},     {"\"a\"\"b\"", "a|b"},        {"\"a b\" \" \" x", "a b| |x"},
-    {"# cmd", ""},    {"x a\"b c\"d", "x|b c|d"},   {"cmd \"a\"\"\" x", "cmd|a|x"},
-    {" # b", "#|b"},  {"a\\ \"b\\\"", "a\\|b\\"},   {"\t  cmd  -p\t1\r\n", "cmd|-p|1"},
-    {" \t\r\n ", ""}, {"cmd -u\"\" x", "cmd||x"},   {"\xC3\xA4 \xFF", "\xC3\xA4|\xFF"},
-    {"a #b", "a|#b"}, {"\"\" cmd \"\" x", "cmd|x"},
-};
-
-TEST(CommandSet, SplitsALineAndRefusesAnOpenQuotation) {
+TEST(CommandSet, AnOpenQuotationIsRefusedWithItsText) {
     EXPECT_EQ(split(nullptr), Words());
-    for (const auto& [line, words] : tokeniserCases) {
-        EXPECT_EQ(split(line), pieces(words)) << line;
-    }
     const MessageRecorder messages;
-    EXPECT_THROW(CommandSet::string2CommandSet("cmd x\"abc d"), DataMismatchException);
-    EXPECT_THROW(CommandSet::string2CommandSet("\""), DataMismatchException);
+    EXPECT_THROW(split("cmd x\"abc d"), DataMismatchException);
+    EXPECT_THROW(split("\""), DataMismatchException);
     EXPECT_THAT(messages.info(),
                 ElementsAre("Missing closing quotation mark abc d.\n", "Missing closing quotation mark .\n"));
     EXPECT_EQ(messages.all().at(0).file, "../s/CommandSet");
 }
 
-// All lines up to eight characters of an alphabet with one character of each kind.
+// All lines up to eight characters of an alphabet with one character of each kind, and up to five of one with more. The
+// zero of an alphabet ends a line, so that those that are shorter are among them.
 TEST(CommandSet, SplitsAllShortLinesAsTheModelDoes) {
-    const std::string alphabet = "a\" #";
+    const std::pair<std::string, int> alphabets[] = {{{"\0a\" #", 5}, 8}, {{"\0a\"\t\n\r\v\\\xFF", 9}, 5}};
     MessageRecorder messages;
-    for (std::size_t length = 1; length <= 8; ++length) {
-        const std::size_t lines = std::size_t{1} << (2 * length);
+    for (const auto& [alphabet, length] : alphabets) {
+        const auto lines = static_cast<std::size_t>(std::pow(alphabet.size(), length));
         for (std::size_t number = 0; number < lines; ++number) {
             std::string line;
-            for (std::size_t i = 0; i < length; ++i) {
-                line += alphabet[(number >> (2 * i)) & 3];
+            for (std::size_t rest = number; rest > 0; rest /= alphabet.size()) {
+                line += alphabet[rest % alphabet.size()];
             }
             const std::optional<Words> expected = splitByModel(line);
             if (expected) {
                 ASSERT_EQ(split(line.c_str()), *expected) << line;
             } else {
-                ASSERT_THROW(CommandSet::string2CommandSet(line.c_str()), DataMismatchException) << line;
+                ASSERT_THROW(split(line.c_str()), DataMismatchException) << line;
                 messages.clear();
             }
         }
@@ -136,7 +110,7 @@ TEST(CommandSet, GrowsByDoublingAndKeepsItsTokens) {
 }
 
 TEST(CommandSet, CopiesAreIndependent) {
-    CommandSet source = setOf("a|b");
+    CommandSet source = setOf("a b");
     CommandSet copy(source);
     copy.resetCommand(0, "other");
     CommandSet assigned = setOf("x");
@@ -154,15 +128,15 @@ constexpr const char* lowest = "Position should start from 1.\n";
 constexpr const char* noNumber = "Expect an integer after -p|-position.\n";
 // The tokens, then what they are a position higher, and a position lower, with the message of a refused step down.
 const std::tuple<const char*, const char*, const char*, const char*> positionCases[] = {
-    {"cmd|3", "cmd|3", "cmd|3", nullptr},
-    {"assign|-p|1|2|-file|x|3", "assign|-p|2|3|-file|x|3", "assign|-p|0|1|-file|x|3", nullptr},
-    {"-POSITION|9", "-POSITION|10", "-POSITION|8", nullptr},
-    {"-pos|9", "-pos|9", "-pos|9", nullptr},
-    {"-p|0", "-p|1", "-p|0", lowest},
-    {"-p|x", "-p|1", "-p|x", noNumber},
-    {"-p|", "-p|1", "-p|", noNumber},
-    {"-p|2|x|3", "-p|3|1|4", "-p|1|x|3", noNumber},
-    {"-p|2147483647", "-p|2147483647", "-p|2147483646", nullptr},
+    {"cmd 3", "cmd 3", "cmd 3", nullptr},
+    {"assign -p 1 2 -file x 3", "assign -p 2 3 -file x 3", "assign -p 0 1 -file x 3", nullptr},
+    {"-POSITION 9", "-POSITION 10", "-POSITION 8", nullptr},
+    {"-pos 9", "-pos 9", "-pos 9", nullptr},
+    {"-p 0", "-p 1", "-p 0", lowest},
+    {"-p x", "-p 1", "-p x", noNumber},
+    {"-p x\"\"", "-p 1", "-p x\"\"", noNumber},
+    {"-p 2 x 3", "-p 3 1 4", "-p 1 x 3", noNumber},
+    {"-p 2147483647", "-p 2147483647", "-p 2147483646", nullptr},
 };
 
 TEST(CommandSet, MovesPositionsByOne) {
@@ -170,10 +144,10 @@ TEST(CommandSet, MovesPositionsByOne) {
         const MessageRecorder messages;
         CommandSet up = setOf(before);
         EXPECT_TRUE(up.incrementPositions() && messages.all().empty()) << before;
-        EXPECT_EQ(wordsOf(up), pieces(incremented));
+        EXPECT_EQ(wordsOf(up), split(incremented));
         CommandSet down = setOf(before);
         EXPECT_EQ(down.decrementPositions(), message == nullptr) << before;
-        EXPECT_EQ(wordsOf(down), pieces(decremented));
+        EXPECT_EQ(wordsOf(down), split(decremented));
         EXPECT_EQ(messages.info(), message != nullptr ? Words{message} : Words()) << before;
     }
     EXPECT_TRUE(CommandSet().incrementPositions() && CommandSet().decrementPositions());
@@ -181,7 +155,7 @@ TEST(CommandSet, MovesPositionsByOne) {
 
 TEST(CommandSet, PrintsItsLine) {
     const MessageRecorder messages;
-    const CommandSet commands = setOf("a|%s|b c");
+    const CommandSet commands = setOf("a %s \"b c\"");
     commands.printCommands(true);
     commands.printCommands(false);
     CommandSet().printCommands(true);
