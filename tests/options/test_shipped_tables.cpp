@@ -1,16 +1,17 @@
-// The two option tables: the rows that each operation reads and resets, and its arguments, which go through the parser
-// of their command and come back as the same options.
+// The shipped tables. The two of options: the rows that each operation reads and resets, and its arguments, which go
+// through the parser of their command and come back as the same options. That of preferences: the names of its rows.
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <iterator>
 #include <memory>
 #include <random>
 #include <string>
 #include <vector>
 
 #include "DataPath.h"
+#include "Preference.h"
 #include "examples/batch/OptionReader.h"
 
 namespace {
@@ -150,17 +151,12 @@ TEST(OptionTables, EveryRowComesBackThroughItsCommandAndIsReset) {
     expectTable<MODE_OPTION>(modeOperations, modeOptionRows);
 }
 
-TEST(OptionTables, RowNumbersAndLayoutArePartOfTheInterface) {
-    static_assert(USERCODE == 9 && CMGR_PROGRAM_MAX_OPTION == 24 && REV0_CHECKED == 25 && REV3_CUSTCODE == 56);
-    static_assert(PROGRAM_MAX_OPTIONS == 67 && ERASE_MAX_OPTIONS == 81 && VERIFY_REV0 == 84 && VERIFY_ALL == 92);
-    static_assert(CUSTCODE_REV0 == 94 && LOAD_REV == 104);
+TEST(OptionTables, RowNumbersKeysAndLayoutArePartOfTheInterface) {
+    static_assert(USERCODE == 9 && REV0_CHECKED == 25 && REV3_CUSTCODE == 56 && VERIFY_ALL == 92 && LOAD_REV == 104);
     constexpr std::size_t list = sizeof(std::vector<int>);
     static_assert(sizeof(PROGRAM_OPTION) == 4 && sizeof(MODE_OPTION) == 4);
     static_assert(sizeof(DeviceOptionsMgr) == sizeof(void*) + list + 8 + 2 * list + 8);
     static_assert(sizeof(ModeOptionsMgr) == sizeof(void*) + list + 2 * list + 8);
-    EXPECT_EQ(std::count_if(std::begin(programOptionRows), std::end(programOptionRows),
-                            [](const OptionRow& row) { return row.isSwitch(); }),
-              92);
     EXPECT_STREQ(DeviceOptionsMgr().getAttribute(PROGRAM_MAX_OPTIONS), "PROGRAM_OPTIONS/PROGRAM_MAX_OPTIONS");
     EXPECT_STREQ(ModeOptionsMgr().getAttribute(IDCODE_LOOP_COUNT), "MODE_OPTIONS/IDCODE_LOOP_COUNT");
 }
@@ -176,6 +172,23 @@ TEST(OptionTables, RowsOutsideAreRefused) {
     EXPECT_TRUE(manager.setOption(USERCODE, static_cast<const char*>(nullptr)));
     manager.init_attributes();
     EXPECT_FALSE(manager.setOption(PROGRAM_OPTION(105), true)) << "a description without a value row";
+}
+
+#define TESSAL_NAME(name) #name,
+constexpr const char* enumerators[] = {TESSAL_PREFERENCES(TESSAL_NAME)};
+#undef TESSAL_NAME
+
+TEST(ShippedPreferences, EveryEnumeratorIsTheRowOfItsName) {
+    DeviceProfile::setDataPath(SHIPPED_DATA_DIR);
+    TessalPreference& preferences = *TessalPreference::getPreferenceObject();
+    int row = 0;
+    for (std::string name : enumerators) {
+        name.erase(std::remove(name.begin(), name.end(), '_'), name.end());
+        const auto preference = TessalPreference::PREFERENCE(row++);
+        EXPECT_THAT(TessalPreference::pref2String(preference), testing::StrCaseEq(name));
+        EXPECT_STRNE(preferences.getPreference(preference), "") << name;
+    }
+    EXPECT_STREQ(preferences.getPreference(TessalPreference::PREFERENCE(row)), "") << "one row too many";
 }
 
 }  // namespace
