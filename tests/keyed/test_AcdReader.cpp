@@ -1,7 +1,6 @@
 #include <gmock/gmock.h>
 
 #include <climits>
-#include <type_traits>
 
 #include "AcdReader.h"
 #include "KeyedFiles.h"
@@ -11,7 +10,6 @@ namespace {
 using testing::ElementsAre;
 using testing::SizeIs;
 
-static_assert(!std::is_copy_constructible_v<AcdReader> && !std::is_copy_assignable_v<AcdReader>);
 static_assert(sizeof(AcdReader) == 2 * sizeof(void*));
 
 class Reader : public KeyedFiles {

@@ -1,7 +1,5 @@
 #include <gmock/gmock.h>
 
-#include <type_traits>
-
 #include "KeyedFiles.h"
 #include "MessageRecorder.h"
 
@@ -10,9 +8,6 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
-
-static_assert(std::is_base_of_v<ProfilePick, ProfileConfig> && std::is_base_of_v<ProfileSpec, ProfilePick>);
-static_assert(std::has_virtual_destructor_v<ProfileSpec>);
 
 /// A text that was handed out, released.
 std::string taken(char* text) {

@@ -33,14 +33,14 @@ TEST_F(KeyTable, FindsCellsAsTheModelDoes) {
     }
 }
 
-TEST_F(KeyTable, TextsLiveAsLongAsTheTable) {
-    m_directory.write("lasting.acd", "[base]\nA = 1,2\nB = 3,4\n");
-    const auto table = openTable("lasting.acd");
-    const char* const field = table->getstringbykey("A", ",", 1, nullptr, 0);
-    const char* const whole = valueOf(*table, "A");
+TEST_F(KeyTable, ReadsBaseWithoutASelectionAndItsTextsLiveAsLongAsItDoes) {
+    m_directory.write("lasting.acd", "[base]\nA = 1,2\nB = 3,4\n[xz1]\nA = 5\n");
+    ProfileKeyTable table("lasting.acd", nullptr, 1, 1, 1);
+    const char* const field = table.getstringbykey("A", ",", 1, nullptr, 0);
+    const char* const whole = valueOf(table, "A");
     for (const char* const separator : {",", ";", "1", "2", "A"}) {
-        table->getstringbykey("B", separator, 0, nullptr, 0);
-        table->getstringbykey("A", separator, 0, nullptr, 0);
+        table.getstringbykey("B", separator, 0, nullptr, 0);
+        table.getstringbykey("A", separator, 0, nullptr, 0);
     }
     EXPECT_STREQ(field, "2");
     EXPECT_STREQ(whole, "1,2");
@@ -58,13 +58,6 @@ TEST_F(KeyTable, FindsManyKeysAndTheLastValueOfEach) {
         const std::string key = "KEY_" + std::to_string(i);
         ASSERT_EQ(table->GetInt32ByKey(key.c_str(), ":", 1, nullptr, 0), i < 2000 ? i + 4000 : i) << key;
     }
-}
-
-TEST_F(KeyTable, NeedsTheSelectionOnlyWhileItOpensAndTakesBaseWithoutOne) {
-    m_directory.write("profiles.acd", "[base]\nA = base\n[xz1]\nA = device\n");
-    EXPECT_STREQ(valueOf(*openTable("profiles.acd", "xz1"), "A"), "device");
-    ProfileKeyTable unselected("profiles.acd", nullptr, 1, 1, 1);
-    EXPECT_STREQ(valueOf(unselected, "A"), "base");
 }
 
 TEST_F(KeyTable, FlagsSilenceTheMessages) {
