@@ -97,16 +97,13 @@ TEST_F(DataFile, LongValuesOfManyLinesReadAsTheModelDoes) {
 TEST_F(DataFile, WithoutAReadableFileTheTableIsEmptyAndOneMessageTellsWhy) {
     m_directory.make("directory.acd");
     m_directory.write("binary.acd", "[base]\nA = 1\n" + std::string(5000, '\x01'));
-    std::vector<std::pair<const char*, const char*>> cases = {{"absent.acd", "cannot be read"},
-                                                              {"directory.acd", "is a directory"},
-                                                              {"binary.acd", "is binary"},
-                                                              {"", "cannot be read"}};
-    for (const char* const device : {"/dev/zero", "/dev/null"}) {
-        if (fs::exists(device)) {
-            cases.emplace_back(device, "is no plain file");
-        }
-    }
+    constexpr std::pair<const char*, const char*> cases[] = {
+        {"absent.acd", "cannot be read"}, {"directory.acd", "is a directory"}, {"binary.acd", "is binary"},
+        {"", "cannot be read"},           {"/dev/zero", "is no plain file"},   {"/dev/null", "is no plain file"}};
     for (const auto& [file, reason] : cases) {
+        if (file[0] == '/' && !fs::exists(file)) {
+            continue;
+        }
         const MessageRecorder messages;
         const auto table = openTable(file);
         EXPECT_EQ(valueOf(*table, "A"), nullptr);

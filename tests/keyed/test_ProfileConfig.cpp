@@ -47,7 +47,7 @@ TEST_F(Config, SelectsAndChecksProfiles) {
 }
 
 TEST_F(Config, ListsAndPrintsProfiles) {
-    MessageRecorder messages;
+    const MessageRecorder messages;
     m_config.make_list(nullptr, nullptr, 0);
     EXPECT_THAT(m_config.profiles(), ElementsAre("base", "xz7s10", "xz7s20", "Brennwick-1"));
     EXPECT_THAT(messages.status(), IsEmpty());
@@ -55,11 +55,6 @@ TEST_F(Config, ListsAndPrintsProfiles) {
     EXPECT_THAT(messages.status(), ElementsAre("xz7s10\n", "xz7s20\n"));
     m_config.make_list("absent.acd", nullptr, 1);
     EXPECT_THAT(m_config.profiles(), IsEmpty());
-    messages.clear();
-    m_config.printme("device");
-    m_config.printme(nullptr);
-    EXPECT_THAT(messages.status(),
-                ElementsAre("device: profile xz7s10, flag 1, binding 1\n", "profile xz7s10, flag 1, binding 1\n"));
 }
 
 TEST_F(Config, NamesDataAndHelpFiles) {
