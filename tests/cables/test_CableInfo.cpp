@@ -39,13 +39,15 @@ TEST(CableInfo, SpeedsOutsideTheTableAreReportedAndShownAsUnknown) {
     MessageRecorder messages;
     CableInfo cable;
     cable.setCableName("my cable");
+    cable.setPortName("LPT");
     cable.setPortSpeed(1234);
     cable.dump();
     EXPECT_THAT(messages.info(), ElementsAre("Invalid speed 1234.\n", "Invalid speed 1234.\n"));
-    EXPECT_THAT(messages.status(),
-                ElementsAre(std::string(42, '-') + "\n", "Cable Name: my cable\n", "Port Number: -1\n",
-                            "Port Speed: 1234\n", "Display Cable Name: my cable\n", "Cable Name w/o space: mycable\n",
-                            "Display Port Speed: unknown\n", "Port Speed string: unknown\n"));
+    EXPECT_THAT(
+        messages.status(),
+        ElementsAre(std::string(42, '-') + "\n", "Cable Name: my cable\n", "Port Name: LPT\n", "Port Number: -1\n",
+                    "Port Speed: 1234\n", "Display Cable Name: my cable\n", "Cable Name w/o space: mycable\n",
+                    "Display Port Speed: unknown\n", "Port Speed string: unknown\n", "Display Port Name: LPT\n"));
     messages.clear();
     for (const char* text : {"5MHz", "", static_cast<const char*>(nullptr)}) {
         EXPECT_EQ(CableInfo::getSpeedNumber(text), -1);
