@@ -52,8 +52,7 @@ using DataFile = KeyedFiles;
 
 // The odd files of the test data, each beside the dump that it must give.
 TEST_F(DataFile, OddFilesGiveTheirDumpsAndEveryPrefixReadsAsTheModelDoes) {
-    for (const char* const name :
-         {"odd_lines", "many_faults", "crlf_bom", "zero_bytes", "cut_off", "endless_comment", "empty"}) {
+    for (const char* const name : {"odd_lines", "crlf_bom", "zero_bytes", "cut_off", "endless_comment", "empty"}) {
         fs::path file = fs::absolute(fs::u8path(TEST_DATA_DIR)) / name;  // no search below the data path
         const std::string expected = bytesOf(file.replace_extension(".dump"));
         EXPECT_EQ(dump(file.replace_extension(".acd")), expected);
@@ -97,9 +96,12 @@ TEST_F(DataFile, LongValuesOfManyLinesReadAsTheModelDoes) {
 TEST_F(DataFile, WithoutAReadableFileTheTableIsEmptyAndOneMessageTellsWhy) {
     m_directory.make("directory.acd");
     m_directory.write("binary.acd", "[base]\nA = 1\n" + std::string(5000, '\x01'));
+    fs::resize_file(m_directory.write("huge.acd", ""), (std::uintmax_t{1} << 30) + 1);
     constexpr std::pair<const char*, const char*> cases[] = {
-        {"absent.acd", "cannot be read"}, {"directory.acd", "is a directory"}, {"binary.acd", "is binary"},
-        {"", "cannot be read"},           {"/dev/zero", "is no plain file"},   {"/dev/null", "is no plain file"}};
+        {"absent.acd", "cannot be read"}, {"directory.acd", "is a directory"},
+        {"binary.acd", "is binary"},      {"huge.acd", "is too large"},
+        {"", "cannot be read"},           {"/dev/zero", "is no plain file"},
+        {"/dev/null", "is no plain file"}};
     for (const auto& [file, reason] : cases) {
         if (file[0] == '/' && !fs::exists(file)) {
             continue;
@@ -123,6 +125,16 @@ TEST_F(DataFile, LongLinesAreReadWhole) {
     EXPECT_STREQ(valueOf(*table, "LAST"), "1");
     EXPECT_THAT(messages.info(),
                 ElementsAre(AllOf(HasSubstr("long.acd:2: "), EndsWith("xxx...\"\n"), SizeIs(testing::Lt(300U)))));
+}
+
+TEST_F(DataFile, MessagesAboutOneFileAreBounded) {
+    std::ostringstream bytes("[base]\n", std::ios::ate);
+    std::fill_n(std::ostream_iterator<const char*>(bytes), 150, "x\n");
+    m_directory.write("faults.acd", bytes.str() + "GOOD = 1\n");
+    const MessageRecorder messages;
+    EXPECT_STREQ(valueOf(*openTable("faults.acd"), "GOOD"), "1");
+    EXPECT_THAT(messages.info(), SizeIs(101));
+    EXPECT_THAT(messages.info().back(), HasSubstr("50 more messages are left out"));
 }
 
 TEST_F(DataFile, TheFirstSourceOfDirectoriesThatIsSetIsTheOnlyOne) {
