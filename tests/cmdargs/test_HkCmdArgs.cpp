@@ -209,6 +209,26 @@ TEST(HkCmdArgs, BadCallsAreErrors) {
     EXPECT_EQ(HkCmdArgs::nearest(nullptr, {"", "program"}), nullptr);
 }
 
+TEST(HkCmdArgs, DescribesEachArgument) {
+    using testing::FieldsAre;
+    using testing::IsEmpty;
+    using Kind = HkCmdArgInfo::Kind;
+    using Type = HkCmdArgInfo::Type;
+    const char* const format =
+        "-a|-all [-m <mode=x|y> 'one or the other']... [-v [<level=int>]] \"on\" <size=hex 2>...";
+    EXPECT_THAT(HkCmdArgs::describe(format),
+                ElementsAre(FieldsAre(Kind::Switch, ElementsAre("-a", "-all"), Type::None, "", "", IsEmpty(), true,
+                                      false, false, false, ""),
+                            FieldsAre(Kind::Switch, ElementsAre("-m"), Type::Choice, "mode", "one of x, y",
+                                      ElementsAre("x", "y"), false, true, false, false, "one or the other"),
+                            FieldsAre(Kind::Switch, ElementsAre("-v"), Type::Integer, "level", "an integer", IsEmpty(),
+                                      false, false, false, true, ""),
+                            FieldsAre(Kind::Word, ElementsAre("on"), Type::None, "", "", IsEmpty(), true, false, false,
+                                      false, ""),
+                            FieldsAre(Kind::Positional, ElementsAre("size"), Type::Hex, "size",
+                                      "a hexadecimal number of 2 digits", IsEmpty(), true, false, true, false, "")));
+}
+
 TEST(HkCmdArgs, ManyErrorsAreCutAndLongTokensShortened) {
     const MessageRecorder recorder;
     EXPECT_EQ(parsed("[-p]", Lines(100001, "wrong\n"), HkCmdArgs::NoUsage).errorCount(), 100000);
