@@ -1,8 +1,6 @@
 // Several processes open, lock, give back and close one port without a pause, while the parent kills one or another at
 // random moments and starts a new one in its place. Each round has a port of its own and checks: at most one holder,
-// no unit lost, nobody blocked, and a fresh port when all are gone.
-//
-// By hand, for an hour: test_access --role torture 3600 [seed]
+// no unit lost, nobody blocked, and a fresh port when all are gone. TESSAL_TORTURE_SECONDS makes it last longer.
 #include <gtest/gtest.h>
 
 #include <array>
@@ -13,7 +11,6 @@
 #include <iostream>
 #include <random>
 #include <thread>
-#include <utility>
 
 #include "Access.h"
 #include "Port.h"
@@ -23,7 +20,7 @@
 
 namespace {
 
-using std::chrono::milliseconds;
+using Clock = std::chrono::steady_clock;
 
 constexpr int maxWorkers = 500;  // in one round, those that take a killed one's place included
 
@@ -33,8 +30,6 @@ struct Board {
     std::atomic<int> finish;
     std::atomic<int> holder;  ///< number of the worker that drives the port now; 0 for none
     std::atomic<int> doomed[maxWorkers + 1];
-    // Of all rounds:
-    std::atomic<int> openings;
     std::atomic<int> locks;
     std::atomic<int> faults;
 
@@ -55,7 +50,6 @@ public:
         do {
             Access share(m_board.port, Access::SHARE);
             Access count(m_board.port, Access::COUNT);
-            ++m_board.openings;
             for (auto rounds = 1 + m_random() % 20; rounds > 0; --rounds) {
                 useShare(share);
                 useCount(count);
@@ -102,145 +96,96 @@ const Role worker{"torture worker", [](const RoleArguments& arguments) {
                       return 0;
                   }};
 
-class Torture {
+/// A port and those who work on it.
+class Round {
 public:
-    explicit Torture(unsigned seed) : m_random(seed) {}
+    Round() { m_board.port = freshPort(); }
 
-    int faults() const { return m_board.faults; }
+    int port() const { return m_board.port; }
+    int kills() const { return m_started - static_cast<int>(m_places.size()); }
 
-    /// Half of the rounds keep a handle of their own, so that the semaphore lives through them, and half of them kill.
-    void run(std::chrono::seconds time) {
-        const auto end = Clock::now() + time;
-        const milliseconds timeOfRound(time < std::chrono::seconds(20) ? 300 : 2000);
-        int rounds = 0;
-        for (; rounds < 4 || Clock::now() < end; ++rounds) {
-            runRound(rounds % 2 != 0, rounds % 4 >= 2, timeOfRound);
-        }
-        m_board.expect(m_kills > 0, "nobody was killed");
-        std::printf("torture: %d rounds, %d kills (%d of holders), %d openings, %d locks, %d faults\n", rounds, m_kills,
-                    m_killedHolders, m_board.openings.load(), m_board.locks.load(), faults());
-    }
-
-private:
-    using Clock = std::chrono::steady_clock;
-
-    struct Place {
-        int number;
-        std::unique_ptr<ChildProcess> process;
-        bool isWorking;
-    };
-
-    void runRound(bool isKept, bool hasKills, milliseconds time) {
-        prepareBoard();
-        const int locks = m_board.locks;
-        std::vector<Access> keepers;
-        if (isKept) {
-            keepers.emplace_back(m_board.port, Access::SHARE);
-            keepers.emplace_back(m_board.port, Access::COUNT);
-        }
+    void work(bool hasKills, Clock::duration time) {
         for (Place& place : m_places) {
             start(place);
         }
-        for (Place& place : m_places) {
-            await(place);
-        }
         const auto end = Clock::now() + time;
-        for (std::size_t turn = 0; Clock::now() < end && m_started < maxWorkers; ++turn) {
-            Place& place = m_places.at(turn % m_places.size());
-            await(place);
-            std::this_thread::sleep_for(std::chrono::microseconds(m_random() % 5000));
-            if (hasKills) {
-                kill(place);
-            }
+        for (std::size_t turn = 0; hasKills && Clock::now() < end && m_started < maxWorkers; ++turn) {
+            replace(m_places.at(turn % m_places.size()));
         }
-        finish();
-        m_board.expect(hasKills || m_board.locks > locks, "nobody got the port");
-        if (isKept) {
-            checkKept(keepers.front(), keepers.back());
-            keepers.clear();
+        std::this_thread::sleep_until(end);
+        m_board.finish = 1;
+        for (const Place& place : m_places) {
+            EXPECT_EQ(place.process->wait(), 0) << "a worker did not come to its end";
         }
-        checkFresh();
+        EXPECT_TRUE(hasKills || m_board.locks > 0) << "nobody got the port";
+        EXPECT_EQ(m_board.faults, 0);
     }
 
-    void prepareBoard() {
-        m_board.port = freshPort();
-        m_board.finish = 0;
-        m_board.holder = 0;
-        for (std::atomic<int>& mark : m_board.doomed) {
-            mark = 0;
-        }
-        m_started = 0;
+    void expectWhole(Access& share, Access& count) const {
+        const bool isWhole = share.lock();
+        EXPECT_TRUE(isWhole || kills() > 0) << "the unit is lost";
+        EXPECT_FALSE(isWhole && share.lock()) << "there are two units";
+        EXPECT_LE(count.getNormalizedCount(), kills()) << "slots are lost";
     }
+
+    void expectFreshPort() const {
+        EXPECT_TRUE(isFree(port())) << "the port is blocked";
+        EXPECT_EQ(Access(port(), Access::COUNT).getNormalizedCount(), 0) << "slots outlive their clients";
+        EXPECT_TRUE(isNothingLeft(port())) << "the semaphore outlives its handles";
+    }
+
+private:
+    struct Place {
+        int number;
+        std::unique_ptr<ChildProcess> process;
+    };
 
     void start(Place& place) {
         const std::string number = std::to_string(++m_started);
-        place = {m_started, ChildProcess::start("torture worker", {m_path, number, std::to_string(m_random())}), false};
+        place = {m_started, ChildProcess::start("torture worker", {m_path, number, std::to_string(m_random())})};
     }
 
-    /// A loaded machine takes its time to start programs, which is no part of the round.
-    void await(Place& place) {
-        if (!std::exchange(place.isWorking, true)) {
-            m_board.expect(place.process->read() == "working", "a worker did not start");
-        }
-    }
-
-    void kill(Place& place) {
+    /// Kills one that is at work, at any moment of it.
+    void replace(Place& place) {
+        EXPECT_EQ(place.process->read(), "working");
+        std::this_thread::sleep_for(std::chrono::microseconds(m_random() % 5000));
         m_board.doomed[place.number] = 1;  // before it dies, so that nobody takes what it leaves for a fault
         place.process->kill();
-        m_killedHolders += m_board.holder == place.number;
-        ++m_kills;
         start(place);
-    }
-
-    void finish() {
-        m_board.finish = 1;
-        for (const Place& place : m_places) {
-            m_board.expect(place.process->wait() == 0, "a worker did not come to its end");
-        }
-    }
-
-    void checkKept(Access& share, Access& count) {
-        const int kills = m_started - static_cast<int>(m_places.size());
-        const bool isWhole = share.lock();
-        m_board.expect(isWhole || kills > 0, "the unit is lost");
-        m_board.expect(!isWhole || !share.lock(), "there are two units");
-        m_board.expect(count.getNormalizedCount() <= kills, "slots are lost");
-    }
-
-    void checkFresh() {
-        m_board.expect(isFree(m_board.port), "the port is blocked");
-        m_board.expect(Access(m_board.port, Access::COUNT).getNormalizedCount() == 0, "slots outlive their clients");
-        m_board.expect(isNothingLeft(m_board.port), "the semaphore outlives its handles");
     }
 
     const TemporaryDirectory m_directory;
     const std::string m_path = m_directory / "board";
     const SharedFile m_file{m_path, sizeof(Board)};
     Board& m_board = m_file.as<Board>();
-    std::mt19937 m_random;
+    std::mt19937 m_random{std::random_device{}()};
     std::array<Place, 4> m_places{};
-    int m_started = 0;  ///< in this round
-    int m_kills = 0;
-    int m_killedHolders = 0;
+    int m_started = 0;
 };
-
-/// Gives the number of faults.
-int torture(int seconds, unsigned seed) {
-    std::printf("torture: seed %u\n", seed);
-    Torture rounds(seed);
-    rounds.run(std::chrono::seconds(seconds));
-    return rounds.faults();
-}
-
-const Role byHand{"torture", [](const RoleArguments& arguments) {
-                      const unsigned seed = arguments.size() > 1 ? static_cast<unsigned>(std::stoul(arguments[1]))
-                                                                 : std::random_device{}();
-                      return torture(std::stoi(arguments.at(0)), seed) == 0 ? 0 : 1;
-                  }};
 
 }  // namespace
 
+// Half of the rounds keep a handle of their own, so that the semaphore lives through them, and half of them kill.
 TEST(AccessTorture, FindsNoFault) {
-    const char* const seconds = std::getenv("TESSAL_TORTURE_SECONDS");
-    EXPECT_EQ(torture(seconds != nullptr ? std::atoi(seconds) : 4, std::random_device{}()), 0);
+    const char* const told = std::getenv("TESSAL_TORTURE_SECONDS");
+    const std::chrono::seconds time(told != nullptr ? std::atoi(told) : 4);
+    const std::chrono::milliseconds timeOfRound(time < std::chrono::seconds(20) ? 300 : 2000);
+    const auto end = Clock::now() + time;
+    int kills = 0;
+    for (int number = 0; number < 4 || Clock::now() < end; ++number) {
+        Round round;
+        std::vector<Access> keepers;
+        if (number % 2 != 0) {
+            keepers.emplace_back(round.port(), Access::SHARE);
+            keepers.emplace_back(round.port(), Access::COUNT);
+        }
+        round.work(number % 4 >= 2, timeOfRound);
+        if (!keepers.empty()) {
+            round.expectWhole(keepers.front(), keepers.back());
+            keepers.clear();
+        }
+        round.expectFreshPort();
+        kills += round.kills();
+    }
+    EXPECT_GT(kills, 0);
 }

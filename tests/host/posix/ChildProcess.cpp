@@ -1,6 +1,5 @@
 #include "../ChildProcess.h"
 
-#include <poll.h>
 #include <signal.h>
 #include <spawn.h>
 #include <sys/socket.h>
@@ -8,21 +7,17 @@
 #include <unistd.h>
 
 #include <stdexcept>
-#include <thread>
 
 namespace {
 
 struct PosixChild final : ChildProcess {
-    pid_t process = -1;
-    int socket = -1;  ///< leads to the child's standard input and output
+    pid_t process = -1;  ///< -1 behind its end
+    int socket = -1;     ///< leads to the child's standard input and output
     int status = 0;
-    bool ended = false;
 
     explicit PosixChild(std::vector<std::string>& words) {
-        int ends[2];
-        if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends) != 0) {
-            throw std::runtime_error("no sockets for a child");
-        }
+        int ends[2] = {-1, -1};
+        ::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends);
         socket = ends[0];
         posix_spawn_file_actions_t actions;
         ::posix_spawn_file_actions_init(&actions);
@@ -46,40 +41,28 @@ struct PosixChild final : ChildProcess {
         ::close(socket);
     }
 
-    bool reap(int options) {
-        ended = ended || ::waitpid(process, &status, options) == process;
-        return ended;
-    }
-
     // Where the child has ended nothing is sent, as the next read tells.
     void send(const std::string& text) override { ::send(socket, text.data(), text.size(), MSG_NOSIGNAL); }
 
-    bool receive(std::string& received, Clock::time_point end) override {
-        const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(end - Clock::now()).count();
-        pollfd ready{socket, POLLIN, 0};
-        char buffer[512];
-        if (left <= 0 || ::poll(&ready, 1, static_cast<int>(left)) <= 0) {
-            return false;
+    std::string read() override {
+        std::string line;
+        for (char byte = 0; ::read(socket, &byte, 1) == 1 && byte != '\n';) {
+            line += byte;
         }
-        const ssize_t count = ::read(socket, buffer, sizeof buffer);
-        received.append(buffer, count > 0 ? static_cast<std::size_t>(count) : 0);
-        return count > 0;
+        return line;
     }
 
     void kill() override {
-        if (!ended) {
+        if (process != -1) {
             ::kill(process, SIGKILL);
-            reap(0);
+            PosixChild::wait();
         }
     }
 
     int wait() override {
-        const auto end = Clock::now() + patience;
-        while (!reap(WNOHANG)) {
-            if (Clock::now() > end) {
-                return -1;
-            }
-            std::this_thread::sleep_for(std::chrono::milliseconds(1));
+        if (process != -1) {
+            ::waitpid(process, &status, 0);
+            process = -1;
         }
         return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
     }

@@ -46,21 +46,13 @@ struct WindowsChild final : ChildProcess {
         ::WriteFile(toChild, text.data(), static_cast<DWORD>(text.size()), &count, nullptr);
     }
 
-    bool receive(std::string& received, Clock::time_point end) override {
-        DWORD available = 0;
-        while (available == 0) {
-            if (::PeekNamedPipe(fromChild, nullptr, 0, nullptr, &available, nullptr) == FALSE || Clock::now() > end) {
-                return false;
-            }
-            if (available == 0) {
-                ::Sleep(1);
-            }
-        }
-        char buffer[512];
+    std::string read() override {
+        std::string line;
         DWORD count = 0;
-        ::ReadFile(fromChild, buffer, sizeof buffer, &count, nullptr);
-        received.append(buffer, count);
-        return count > 0;
+        for (char byte = 0; ::ReadFile(fromChild, &byte, 1, &count, nullptr) != FALSE && byte != '\n';) {
+            line += byte;
+        }
+        return line.substr(0, line.find('\r'));
     }
 
     void kill() override {
@@ -69,11 +61,9 @@ struct WindowsChild final : ChildProcess {
     }
 
     int wait() override {
-        const auto bound = std::chrono::duration_cast<std::chrono::milliseconds>(patience).count();
         DWORD status = killedStatus;
-        if (::WaitForSingleObject(process.hProcess, static_cast<DWORD>(bound)) == WAIT_OBJECT_0) {
-            ::GetExitCodeProcess(process.hProcess, &status);
-        }
+        ::WaitForSingleObject(process.hProcess, INFINITE);
+        ::GetExitCodeProcess(process.hProcess, &status);
         return status == killedStatus ? -1 : static_cast<int>(status);
     }
 };
