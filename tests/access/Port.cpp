@@ -4,6 +4,8 @@
 #include <iostream>
 #include <stdexcept>
 
+#include "host/Role.h"
+
 namespace {
 
 int answer(Access& access, const std::string& line) {
@@ -12,21 +14,20 @@ int answer(Access& access, const std::string& line) {
                            : access.getNormalizedCount();
 }
 
-const Role portUser{"port user", &usePort};
+const Role portUser{"port user", [](const RoleArguments& arguments) {
+                        Access access(std::stoi(arguments.at(0)),
+                                      static_cast<Access::ACCESS_TYPE>(std::stoi(arguments.at(1))));
+                        std::cout << "open" << std::endl;
+                        for (std::string line; std::getline(std::cin, line);) {
+                            std::cout << answer(access, line) << std::endl;
+                        }
+                        return 0;
+                    }};
 
 }  // namespace
 
-int usePort(const RoleArguments& arguments) {
-    Access access(std::stoi(arguments.at(0)), static_cast<Access::ACCESS_TYPE>(std::stoi(arguments.at(1))));
-    std::cout << "open" << std::endl;
-    for (std::string line; std::getline(std::cin, line);) {
-        std::cout << answer(access, line) << std::endl;
-    }
-    return 0;
-}
-
-std::unique_ptr<ChildProcess> startPortUser(int port, Access::ACCESS_TYPE type, const char* role) {
-    auto process = ChildProcess::start(role, {std::to_string(port), std::to_string(type)});
+std::unique_ptr<ChildProcess> startPortUser(int port, Access::ACCESS_TYPE type) {
+    auto process = ChildProcess::start("port user", {std::to_string(port), std::to_string(type)});
     if (process->read() != "open") {
         throw std::runtime_error("the child did not open its port");
     }

@@ -13,9 +13,9 @@
 #include "Port.h"
 #include "platform/NamedSemaphore.h"
 
+using testing::AnyOf;
 using testing::ElementsAre;
 using testing::IsEmpty;
-using testing::StartsWith;
 
 namespace {
 
@@ -48,15 +48,6 @@ TEST(AccessId, HasAFamilyForEachPortName) {
     }
 }
 
-TEST(AccessId, TellsItsWorkAndAnUnknownName) {
-    const MessageRecorder messages;
-    Access::generatePortId("usb2", 1, Access::COUNT);
-    Access::generatePortId("LPT1", 0, Access::SHARE);
-    EXPECT_THAT(messages.debug(), ElementsAre(" Generating id for usb2, port 1. share type = COUNT\n",
-                                              " Generating id for LPT1, port 0. share type = SHARE\n",
-                                              "Invalid port name: LPT1. shar type = 0.\n"));
-}
-
 TEST(AccessShare, ExcludesOthersUntilGivenBack) {
     const int port = freshPort();
     Access first(port, Access::SHARE);
@@ -76,24 +67,13 @@ TEST(AccessShare, ExcludesOthersUntilGivenBack) {
     EXPECT_THAT(messages.status(), ElementsAre(" ReleaseSemaphore rc = 298.\n"));
 }
 
-TEST(AccessShare, IsGivenBackByTheDestructorOfItsHolderOnly) {
-    const int port = freshPort();
-    Access keeper(port, Access::SHARE);
-    {
-        Access holder(port, Access::SHARE);
-        EXPECT_TRUE(holder.lock());
-        const Access other(port, Access::SHARE);
-    }
-    EXPECT_TRUE(keeper.lock());
-    { const Access other(port, Access::SHARE); }
-    EXPECT_FALSE(Access(port, Access::SHARE).lock());
-}
-
 TEST(AccessCount, CountsFiveClients) {
     const int port = freshPort();
     Access access(port, Access::COUNT);
-    EXPECT_EQ(access.getNormalizedCount(), 0);
     const MessageRecorder messages;
+    EXPECT_EQ(access.incCount(), 0);
+    EXPECT_THAT(messages.status(), ElementsAre(" Count ReleaseSemaphore rc = 298.\n"));
+    EXPECT_EQ(access.getNormalizedCount(), 0);
     for (int client = 1; client <= 5; ++client) {
         EXPECT_EQ(Access(port, Access::COUNT).decCount(), 1);  // destroying detaches nobody
         EXPECT_EQ(access.getNormalizedCount(), client);
@@ -101,28 +81,7 @@ TEST(AccessCount, CountsFiveClients) {
     EXPECT_EQ(access.decCount(), 0);
     EXPECT_EQ(access.incCount(), 1);
     EXPECT_EQ(access.getNormalizedCount(), 4);
-    EXPECT_THAT(messages.status(), IsEmpty());
-    EXPECT_THAT(messages.debug(),
-                testing::IsSupersetOf({" Cable Client Count = 4.\n", " Cable Normalized Count = 4.\n"}));
-}
-
-TEST(AccessCount, RefusesMoreSlotsThanThereAre) {
-    Access access(freshPort(), Access::COUNT);
-    const MessageRecorder messages;
-    EXPECT_EQ(access.incCount(), 0);
-    EXPECT_EQ(access.getNormalizedCount(), 0);
-    EXPECT_THAT(messages.status(), ElementsAre(" Count ReleaseSemaphore rc = 298.\n"));
-    EXPECT_THAT(messages.debug(), ElementsAre(" Cable Client Count = 5.\n", " Cable Normalized Count = 0.\n"));
-}
-
-TEST(Access, TellsNameAndIdOfItsSemaphore) {
-    const int port = freshPort();
-    const MessageRecorder messages;
-    const Access first(port, Access::COUNT);
-    const Access second(port, Access::COUNT);
-    const std::string name = " Semaphore name = CableShareCount" + std::to_string(port) + ".\n";
-    EXPECT_THAT(messages.debug(), ElementsAre(name, StartsWith(" Creating semaphore, id=0x"), name,
-                                              StartsWith(" Reusing semaphore, id=0x")));
+    EXPECT_EQ(messages.status().size(), 1U);
 }
 
 TEST(Access, CopiesAreIndependentAndHoldNothing) {
@@ -142,8 +101,9 @@ TEST(Access, CopiesAreIndependentAndHoldNothing) {
     EXPECT_TRUE(holder.unlock());
 }
 
-TEST(Access, MovingTakesTheUnitAlong) {
+TEST(Access, MovingTakesTheUnitAlongAndTheEndOfItsHolderGivesItBack) {
     const int port = freshPort();
+    const Access keeper(port, Access::SHARE);  // without it, the last handle's end would free the port
     std::vector<Access> held;
     held.emplace_back(port, Access::SHARE);
     EXPECT_TRUE(held.front().lock());
@@ -169,9 +129,6 @@ TEST(Access, WorksOnWithoutASemaphore) {
     EXPECT_EQ(source.getNormalizedCount(), 5);
     const Access copy(source);
     EXPECT_THAT(messages.status(), ElementsAre(" ReleaseSemaphore rc = 6.\n", " Count ReleaseSemaphore rc = 6.\n"));
-    EXPECT_THAT(messages.debug(), ElementsAre("Invalid WaitForSingleObject result = 0xFFFFFFFF.\n",
-                                              "Invalid WaitForSingleObject result = 0xFFFFFFFF.\n",
-                                              " Cable Client Count = 5.\n", " Cable Normalized Count = 5.\n"));
 }
 
 TEST(NamedSemaphore, KeepsTheCountsOfTheOneThatLives) {
@@ -200,15 +157,6 @@ TEST(NamedSemaphore, RefusesWhatCannotBe) {
     EXPECT_STRNE(NamedSemaphore::explainLastError(), "");
 }
 
-TEST(AccessProcesses, KilledHolderLeavesAFreshPortIfNobodyElseHasIt) {
-    const int port = freshPort();
-    const auto holder = startPortUser(port);
-    ASSERT_EQ(holder->ask("lock"), "1");
-    EXPECT_FALSE(isFree(port));
-    holder->kill();
-    EXPECT_TRUE(isFree(port));
-}
-
 TEST(AccessProcesses, KilledHolderLeavesTheCountToThoseWhoRemain) {
     const int port = freshPort();
     Access keeper(port, Access::SHARE);
@@ -232,27 +180,28 @@ TEST(AccessProcesses, KilledClientsKeepTheirSlotsUntilTheLastOneGoes) {
     EXPECT_EQ(Access(port, Access::COUNT).getNormalizedCount(), 0);
 }
 
-// The role "stepper" opens, locks, gives back and closes a port, and is killed at one of its calls of the host.
+// The role "stepper" opens, locks, gives back and closes a port, and is killed at one of its steps: at each call of the
+// host, and while it holds the port.
 TEST(AccessSteps, KilledAtEachHostCallLeavesTheCountToThoseWhoRemainOrAFreshPort) {
     for (const bool isKept : {false, true}) {
         const int port = freshPort();
-        bool gotThrough = false;
-        for (int step = 1; !gotThrough && step < 100; ++step) {
+        int status = -1;
+        for (int step = 1; status != 0 && step < 100; ++step) {
             SCOPED_TRACE("step " + std::to_string(step) + (isKept ? " beside a holder" : ""));
             std::vector<Access> keepers;
             if (isKept) {
                 keepers.emplace_back(port, Access::SHARE);
                 ASSERT_TRUE(keepers.front().lock());
             }
-            const auto child = ChildProcess::start("stepper", {std::to_string(port), std::to_string(step)});
-            gotThrough = child->wait() == 0;
+            status = ChildProcess::start("stepper", {std::to_string(port), std::to_string(step)})->wait();
+            ASSERT_THAT(status, AnyOf(-1, 0)) << "neither killed nor done";
             ASSERT_EQ(isFree(port), !isKept);
             ASSERT_TRUE(!isKept || keepers.front().unlock());
             ASSERT_TRUE(isFree(port));
             keepers.clear();
             ASSERT_TRUE(isNothingLeft(port));
         }
-        EXPECT_TRUE(gotThrough);
+        EXPECT_EQ(status, 0);
     }
 }
 

@@ -1,14 +1,10 @@
 // A second copy of the library in the process: a module with all its objects, which shares none of them.
+#include <functional>
+#include <memory>
+
 #include "Access.h"
 
-extern "C" __attribute__((visibility("default"))) void* copyOpen(int port) {
-    return new Access(port, Access::SHARE);
-}
-
-extern "C" __attribute__((visibility("default"))) bool copyLock(void* access) {
-    return static_cast<Access*>(access)->lock();
-}
-
-extern "C" __attribute__((visibility("default"))) void copyClose(void* access) {
-    delete static_cast<Access*>(access);
+/// Opens a port: a call of @p lock locks it, and its end closes it.
+extern "C" __attribute__((visibility("default"))) void copyOpen(int port, std::function<bool()>& lock) {
+    lock = [access = std::make_shared<Access>(port, Access::SHARE)] { return access->lock(); };
 }
