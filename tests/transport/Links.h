@@ -12,12 +12,9 @@
 #include "TessalPipe.h"
 #include "TessalPortMux.h"
 #include "TessalSocket.h"
-#include "platform/StreamSocket.h"
 
 /// Two ends, connected, each behind a multiplexer.
 struct Link {
-    static constexpr std::size_t blockSize = std::size_t{3} << 20;  ///< more than the buffers between the ends hold
-
     TessalPortMux client{false};
     TessalPortMux server{false};
 };
@@ -49,9 +46,9 @@ public:
         m_server = listeningServer(port);
         m_client = std::make_unique<TessalSocket>(1, "127.0.0.1", port);
         std::future<bool> connected = std::async(std::launch::async, [&] { return m_client->initialize(); });
-        m_server->setClientSocketFd(m_server->acceptClient(nullptr, nullptr));
         client.setSocketHandle(m_client.get());
         server.setSocketHandle(m_server.get());
+        server.setClientSocketFd(m_server->acceptClient(nullptr, nullptr));
         EXPECT_TRUE(connected.get());
     }
     ~SocketLink() { closeServerEnd(); }
@@ -92,52 +89,10 @@ private:
     TessalPipe m_client{1, m_name.c_str()};
 };
 
-/// This host, moving one byte a call.
-class ByteByByteHost : public platform::SocketHost {
-public:
-    using Socket = platform::Socket;
-    using Address = platform::SocketAddress;
-
-    bool start() override { return m_real.start(); }
-    void stop() override { m_real.stop(); }
-    Socket openServer() override { return m_real.openServer(); }
-    Socket openClient() override { return m_real.openClient(); }
-    bool bindAny(Socket socket, std::uint16_t port) override { return m_real.bindAny(socket, port); }
-    void listen(Socket socket, int backlog) override { m_real.listen(socket, backlog); }
-    Socket accept(Socket server, sockaddr* from, int* length) override { return m_real.accept(server, from, length); }
-    bool resolve(const char* name, std::uint16_t port, Address& address) override {
-        return m_real.resolve(name, port, address);
-    }
-    bool connect(Socket socket, const Address& address) override { return m_real.connect(socket, address); }
-    std::int64_t receive(Socket socket, char* data, int) override { return m_real.receive(socket, data, 1); }
-    std::int64_t send(Socket socket, const char* data, int) override { return m_real.send(socket, data, 1); }
-    bool close(Socket socket) override { return m_real.close(socket); }
-    int lastError() override { return m_real.lastError(); }
-    void pause(int milliseconds) override { m_real.pause(milliseconds); }
-
-private:
-    platform::SocketHost& m_real = platform::realSocketHost();
-};
-
-/// A host that the sockets of this process use while it lives.
-template <class Host>
-struct HostInPlace {
-    HostInPlace() { platform::replaceSocketHost(&host); }
-    ~HostInPlace() { platform::replaceSocketHost(nullptr); }
-    HostInPlace(const HostInPlace&) = delete;
-    HostInPlace& operator=(const HostInPlace&) = delete;
-
-    Host host;
-};
-
-struct ByteByByteLink : private HostInPlace<ByteByByteHost>, public SocketLink {
-    static constexpr std::size_t blockSize = 1000;
-};
-
-/// Sends a block to the server's end, which a thread serves, and back.
-template <class LinkType>
-void expectEcho(LinkType& link) {
-    std::string sent(LinkType::blockSize, '\0');
+/// Sends a block, which is more than the buffers between the ends hold, to the server's end, which a thread serves, and
+/// back.
+inline void expectEcho(Link& link) {
+    std::string sent(std::size_t{3} << 20, '\0');
     for (std::size_t i = 0; i < sent.size(); ++i) {
         sent[i] = static_cast<char>(1 + (i * 31 + i / 4096) % 255);
     }

@@ -67,19 +67,6 @@ const Role stepper{"stepper", [](const RoleArguments& arguments) {
                        return 0;
                    }};
 
-/// Forks while it holds the port. The child sleeps or executes another program.
-const Role forker{"forker", [](const RoleArguments& arguments) {
-                      Access access(std::stoi(arguments.at(1)), Access::SHARE);
-                      access.lock();
-                      const pid_t child = ::fork();
-                      if (child == 0) {
-                          ::alarm(60);
-                          return arguments.at(0) == "exec" ? ::execlp("sleep", "sleep", "60", nullptr) : ::pause();
-                      }
-                      std::cout << child << std::endl;
-                      return ::pause();
-                  }};
-
 }  // namespace
 
 bool isNothingLeft(int port) {
@@ -151,16 +138,15 @@ TEST(AccessFork, ChildNeitherGivesBackNorTakes) {
 }
 
 TEST(AccessFork, ChildDoesNotKeepThePortOfItsKilledParent) {
-    for (const char* const mode : {"sleep", "exec"}) {
-        SCOPED_TRACE(mode);
+    for (const bool executes : {false, true}) {
         const int port = freshPort();
-        const auto parent = ChildProcess::start("forker", {mode, std::to_string(port)});
-        const pid_t child = std::stoi(parent->read());
-        EXPECT_FALSE(isFree(port));
-        parent->kill();
-        EXPECT_TRUE(isFree(port));
-        EXPECT_TRUE(isNothingLeft(port));
-        EXPECT_EQ(::kill(child, SIGKILL), 0);
+        const auto hold = [port] {
+            static Access access(port, Access::SHARE);
+            return access.lock();
+        };
+        const Orphan child(hold, executes);
+        EXPECT_TRUE(isFree(port)) << executes;
+        EXPECT_TRUE(isNothingLeft(port)) << executes;
     }
 }
 
