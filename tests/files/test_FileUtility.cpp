@@ -3,6 +3,7 @@
 #include <array>
 #include <filesystem>
 #include <string>
+#include <tuple>
 #include <vector>
 
 #include "FileUtility.h"
@@ -15,24 +16,24 @@ namespace {
 using Texts = std::vector<std::string>;
 
 TEST(FileUtility, TakesPathsApart) {
-    // A path, its tail, head and base.
-    const std::array<const char*, 4> cases[] = {
-        {"", "", "", ""},      {".x", ".x", ".x", ""},      {"abc", "abc", "abc", "abc"},
-        {"\\", "", "", "\\"},  {"a.b/c", "c", "a.b", "a"},  {"a/b\\c", "c", "a/b", "a/b\\c"},
-        {"/x", "x", "", "/x"}, {"abc/", "", "abc", "abc/"}, {"a.t.z", "a.t.z", "a.t.z", "a.t"},
-        {nullptr, "", "", ""}, {"a//b", "b", "a/", "a//b"},
+    // A path, its tail, head and base, and whether it is that of an object file.
+    const std::tuple<const char*, const char*, const char*, const char*, bool> cases[] = {
+        {"", "", "", "", false},
+        {nullptr, "", "", "", false},
+        {"abc", "abc", "abc", "abc", false},
+        {".elf", ".elf", ".elf", "", false},
+        {"\\", "", "", "\\", false},
+        {"/x", "x", "", "/x", false},
+        {"a.elf/b\\c", "c", "a.elf/b", "a", false},
+        {"a//b.ELF", "b.ELF", "a/", "a//b", true},
+        {"a.t.mem", "a.t.mem", "a.t.mem", "a.t", true},
     };
-    for (const auto& [path, tail, head, base] : cases) {
+    for (const auto& [path, tail, head, base, isObject] : cases) {
         SCOPED_TRACE(path != nullptr ? path : "null");
         EXPECT_STREQ(FileUtility::getTail(path), tail);
         EXPECT_STREQ(FileUtility::getHead(path), head);
         EXPECT_STREQ(FileUtility::getBase(path), base);
-    }
-    for (const char* path : {"a.ELF", "b.Mem", "d.x/a.b.elf"}) {
-        EXPECT_TRUE(FileUtility::isObjectFile(path)) << path;
-    }
-    for (const char* path : {"a", "a.bit", "a.elf/b", "a.elfx", "elf", "a.", "", static_cast<const char*>(nullptr)}) {
-        EXPECT_FALSE(FileUtility::isObjectFile(path)) << (path != nullptr ? path : "null");
+        EXPECT_EQ(FileUtility::isObjectFile(path), isObject);
     }
 }
 
@@ -41,10 +42,8 @@ TEST(FileUtility, RmdirRemovesTreesAndAlwaysYieldsTrue) {
     directory.write("tree/a/b/file", "x");
     const std::string file = directory.write("file", "kept");
     const std::string tree = directory / "tree";
-    for (const char* path : {tree.c_str(), tree.c_str(), file.c_str(), "", static_cast<const char*>(nullptr)}) {
-        EXPECT_TRUE(FileUtility::rmdir(path));
-        EXPECT_FALSE(HkFile::exist(tree.c_str()));
-    }
+    EXPECT_TRUE(FileUtility::rmdir(tree.c_str()) && !HkFile::exist(tree.c_str()));
+    EXPECT_TRUE(FileUtility::rmdir(tree.c_str()) && FileUtility::rmdir(file.c_str()) && FileUtility::rmdir(nullptr));
     EXPECT_EQ(directory.read("file"), "kept");
 }
 
@@ -57,59 +56,42 @@ TEST(FileUtility, CopyFileMakesTheDestinationOrReportsWhatFails) {
     EXPECT_EQ(directory.read("new/sub/file"), "content");
     EXPECT_TRUE(recorder.all().empty());
     EXPECT_FALSE(FileUtility::copyFile(from.c_str(), blocked.c_str(), "file"));
-    EXPECT_FALSE(FileUtility::copyFile(from.c_str(), (directory / "new").c_str(), "absent"));
-    EXPECT_FALSE(FileUtility::copyFile(from.c_str(), from.c_str(), "file"));
     EXPECT_FALSE(FileUtility::copyFile(from.c_str(), nullptr, "file"));
+    EXPECT_FALSE(FileUtility::copyFile(from.c_str(), from.c_str(), "absent"));
     EXPECT_FALSE(FileUtility::copyFile(nullptr, from.c_str(), nullptr));
-    const auto copyFailure = [](const std::string& source, const std::string& destination) {
-        return "Failed to copy file from " + source + " to " + destination + ".\n";
-    };
     EXPECT_EQ(recorder.info(), (Texts{"Failed to make destination directory " + blocked + ".\n",
-                                      copyFailure(directory / "absent", directory / "new/absent"),
-                                      copyFailure(directory / "file", directory / "file"),
-                                      "Failed to make destination directory .\n", copyFailure("/", from + "/")}));
+                                      "Failed to make destination directory .\n",
+                                      "Failed to copy file from " + from + "/absent to " + from + "/absent.\n",
+                                      "Failed to copy file from / to " + from + "/.\n"}));
     EXPECT_EQ(recorder.all().front().file, "../s/FileUtility");
-    EXPECT_EQ(directory.read("file"), "content");
 }
 
-TEST(FileUtility, ConvertPathGivesFullPaths) {
+// What climbing and dots of any form give is compared with a model by the fuzz target.
+TEST(FileUtility, ConvertPathGivesFullPathsAndReportsThoseThatLeadNowhere) {
     const TemporaryDirectory directory;
     const std::filesystem::path former = std::filesystem::current_path();
     std::filesystem::current_path(directory.make("a/b"));
     const std::string b = HkFile::getcwd().c_str();
     const std::string a = b.substr(0, b.size() - 2);
-    const std::string top = b.substr(0, b.size() - 4);
-    std::string tooHigh = "x";
-    for (int i = 0; i < 100; ++i) {
-        tooHigh.insert(0, "../");
-    }
-    // A path, its base, the result.
-    const std::array<std::string, 3> cases[] = {
-        {"", "", b + "/"},       {tooHigh, "", b + "/x"},     {"./../../r", "/p/q", "/r"},
-        {"r", "", b + "/r"},     {"../x:y", "", "../x:y"},    {"./r/s", "/p/q", "/p/q/r/s"},
-        {"..", "", b + "/"},     {"..\\x", "/p", a + "/x"},   {"./../r", "\\p\\q", "\\p/r"},
-        {"../", "", a + "/"},    {"c:foo", "base", "c:foo"},  {"/x/../y", "base", "/x/../y"},
-        {"", "/p/q", "/p/q/"},   {"./../r", "/p/q", "/p/r"},  {"r/../.s", "/p", "/p/r/../.s"},
-        {"\\x", "base", "\\x"},  {"r/s", "/p/q", "/p/q/r/s"}, {"../../d/e", "/p", top + "/d/e"},
-        {"..", "/p/q", "/p/q/"}, {".//.\\\\r", "/q", "/q/r"}, {"./../../../r", "/p/q", "/p/q/r"},
+    const std::string absent = "Path does not exist. Please check the path parameters ";
+    // A path, its base, the result and the message.
+    const std::array<std::string, 4> cases[] = {
+        {"", "", b + "/", ""},
+        {"../", "/p", a + "/", ""},
+        {"..\\x", "/p", a + "/x", absent + "..\\x, /p\n"},
+        {"./../r", "\\p\\q", "\\p/r", absent + "./../r, \\p\\q\n"},
+        {"./../../../r", "/p/q", "/p/q/r", absent + "./../../../r, /p/q\n"},
+        {"c:foo", "base", "c:foo", ""},
+        {"\\x", "base", "\\x", ""},
+        {"./.a/b", "/p", "./.a/b", "Illegal input path ./.a/b\n"},
+        {"../...", "", "../...", "Illegal input path ../...\n"},
     };
-    for (const auto& [path, base, result] : cases) {
+    for (const auto& [path, base, result, message] : cases) {
         const MessageRecorder recorder;
         EXPECT_STREQ(FileUtility::convertPath(path.c_str(), base.c_str()), result.c_str()) << path;
-        const std::string absence =
-            "Path does not exist. Please check the path parameters " + path + ", " + base + "\n";
-        const bool isThere = path == result || HkFile::exist(result.c_str());
-        EXPECT_EQ(recorder.info(), isThere ? Texts() : Texts{absence});
+        EXPECT_EQ(recorder.info(), message.empty() ? Texts() : Texts{message});
     }
     std::filesystem::current_path(former);
-}
-
-TEST(FileUtility, ConvertPathRefusesOtherDotsAtTheFront) {
-    for (const char* path : {".a", "..a", "...", "../...", "./.a/b", "....", ".../x"}) {
-        const MessageRecorder recorder;
-        EXPECT_STREQ(FileUtility::convertPath(path, "/p"), path);
-        EXPECT_EQ(recorder.info(), Texts{std::string("Illegal input path ") + path + "\n"});
-    }
 }
 
 }  // namespace

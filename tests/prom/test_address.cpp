@@ -29,31 +29,22 @@ TEST(ComboAddress, PinsStandInTheTopTwoBits) {
                                              "Incorret length 3 of input RS pin, expected 2.\n"));
 }
 
-TEST(ComboAddress, TextsAreUpperCaseHexadecimal) {
-    const std::tuple<const char*, const char*, int, const char*> cases[] = {{"00", "1a", 24, "1A"},
-                                                                            {"11", "001000", 24, "C01000"},
-                                                                            {"", "0", 24, "00000000"},
-                                                                            {"10", "1000", 32, "80001000"},
-                                                                            {nullptr, nullptr, 24, "00000000"}};
-    for (const auto& [pins, start, bits, combo] : cases) {
-        EXPECT_STREQ(PromUtility::GetRSPinAndStartAddressCombo(pins, start, bits), combo);
+TEST(ComboAddress, TakingApartIsTheWayBackInUpperCaseHexadecimal) {
+    const std::tuple<const char*, const char*, const char*, const char*> cases[] = {
+        {"01", "2bcd1", "42BCD1", "2BCD1"}, {"11", "001000", "C01000", "1000"}, {"10", nullptr, "800000", "00000000"}};
+    HkString start;
+    for (const auto& [pins, given, combo, upperStart] : cases) {
+        EXPECT_STREQ(PromUtility::GetRSPinAndStartAddressCombo(pins, given, 24), combo);
+        HkString foundPins("former");
+        PromUtility::DecomposeComboAddress(combo, foundPins, start, 24);
+        EXPECT_STREQ(foundPins, pins);
+        EXPECT_STREQ(start, upperStart);
     }
-}
-
-TEST(ComboAddress, TakingApartIsTheWayBack) {
-    HkString pins("00");
-    unsigned int start = 0;
-    PromUtility::DecomposeComboAddress(0xC01000U, pins, start, 24);
-    EXPECT_STREQ(pins, "00");
-    EXPECT_EQ(start, 0xC01000U) << "no pins in use";
-    HkString startText;
-    for (const char* given : {"10", "01", "11"}) {
-        pins = "former";
-        const HkString combo = PromUtility::GetRSPinAndStartAddressCombo(given, "2bcd1", 24);
-        PromUtility::DecomposeComboAddress(combo, pins, startText, 24);
-        EXPECT_STREQ(pins, given);
-        EXPECT_STREQ(startText, "2BCD1");
-    }
+    EXPECT_STREQ(PromUtility::GetRSPinAndStartAddressCombo("10", "1000", 32), "80001000");
+    HkString unused("00");
+    PromUtility::DecomposeComboAddress("C01000", unused, start, 24);
+    EXPECT_STREQ(unused, "00");
+    EXPECT_STREQ(start, "C01000") << "no pins in use";
 }
 
 }  // namespace
