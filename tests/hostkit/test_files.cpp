@@ -90,12 +90,12 @@ TEST(HkFile, NamesNothingByNullOrTheEmptyText) {
     EXPECT_TRUE(HkFile::open("name", nullptr) == nullptr && HkEnv::GetEnv(nullptr) == nullptr);
 }
 
-// The path of the file is long, its name outside ASCII.
+// The file is deep, its path long, its name outside ASCII.
 TEST(HkFile, TellsFilesFromDirectories) {
     const TemporaryDirectory directory;
     std::string top = directory.path();
-    for (int i = 0; i < 12; ++i) {
-        top += "/" + std::string(50, 'n');
+    for (int depth = 0; depth < 300; ++depth) {
+        top += "/dir";
     }
     ASSERT_TRUE(HkFile::mkdir(top.c_str(), true));
     const std::string file = top + "/" + unicodeName;
@@ -114,7 +114,7 @@ TEST(HkFile, TellsFilesFromDirectories) {
     EXPECT_FALSE(HkFile::rmdir(top.c_str())) << "not empty";
     EXPECT_TRUE(HkFile::remove_f(file.c_str()));
     EXPECT_FALSE(HkFile::remove_f(file.c_str()));
-    EXPECT_TRUE(HkFile::rmtree((directory / std::string(50, 'n')).c_str()));
+    EXPECT_TRUE(HkFile::rmtree((directory / "dir").c_str()));
 }
 
 TEST(HkFile, MakesDirectories) {

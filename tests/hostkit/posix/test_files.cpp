@@ -7,6 +7,7 @@
 
 #include <atomic>
 #include <csignal>
+#include <filesystem>
 #include <string>
 #include <thread>
 
@@ -15,19 +16,11 @@
 
 namespace {
 
-/// All zero where there is nothing.
-struct stat statusOf(const std::string& path) {
-    struct stat status {};
-    ::lstat(path.c_str(), &status);
-    return status;
-}
+namespace fs = std::filesystem;
 
+/// A link is there whatever it leads to.
 bool isThere(const std::string& path) {
-    return statusOf(path).st_mode != 0;
-}
-
-void makeLink(const std::string& target, const std::string& link) {
-    ASSERT_EQ(::symlink(target.c_str(), link.c_str()), 0);
+    return fs::exists(fs::symlink_status(path));
 }
 
 TEST(TreeRemoval, RemovesLinksAndFollowsNone) {
@@ -36,17 +29,17 @@ TEST(TreeRemoval, RemovesLinksAndFollowsNone) {
     directory.make("tree/sub/empty");
     const std::string file = directory.write("victim/file", "kept");
     const std::string tree = directory / "tree";
-    makeLink(directory / "victim", tree + "/to directory");
-    makeLink("../../victim", tree + "/sub/relative");
-    makeLink(file, tree + "/to file");
-    makeLink("itself", tree + "/itself");
-    makeLink("..", tree + "/to parent");
+    fs::create_symlink(directory / "victim", tree + "/to directory");
+    fs::create_symlink("../../victim", tree + "/sub/relative");
+    fs::create_symlink(file, tree + "/to file");
+    fs::create_symlink("itself", tree + "/itself");
+    fs::create_symlink("..", tree + "/to parent");
     for (const char* name : {"tree/new\nline", "tree/back\\slash", "tree/.hidden"}) {
         directory.write(name, "");
     }
     EXPECT_TRUE(HkFile::rmtree(tree.c_str()) && !isThere(tree));
     for (const char* ending : {"", "/", "\\"}) {
-        makeLink(directory / "victim", tree);
+        fs::create_symlink(directory / "victim", tree);
         EXPECT_TRUE(HkFile::rmtree((tree + ending).c_str()) && !isThere(tree)) << ending;
     }
     EXPECT_FALSE(HkFile::rmtree(file.c_str()));
@@ -126,13 +119,14 @@ TEST(HkFileCopy, KeepsAccessRightsAndLinksAndTakesRegularFilesOnly) {
     const std::string fifo = directory / "fifo";
     ::chmod(source.c_str(), 0500);
     ::chmod(old.c_str(), 0666);
-    makeLink("old", directory / "link");
+    fs::create_symlink("old", directory / "link");
     EXPECT_TRUE(HkFile::copy(source.c_str(), (directory / "link").c_str()));
     EXPECT_TRUE(HkFile::copy(source.c_str(), (directory / "copy").c_str()));
     EXPECT_EQ(directory.read("old"), "new");
-    ASSERT_TRUE(::mkfifo(fifo.c_str(), 0600) == 0 && ::link(old.c_str(), (directory / "hard").c_str()) == 0);
-    EXPECT_EQ(statusOf(old).st_mode & 0777U, 0666U);
-    EXPECT_EQ(statusOf(directory / "copy").st_mode & 0777U, 0500U);
+    ASSERT_EQ(::mkfifo(fifo.c_str(), 0600), 0);
+    fs::create_hard_link(old, directory / "hard");
+    EXPECT_EQ(fs::status(old).permissions(), fs::perms(0666));
+    EXPECT_EQ(fs::status(directory / "copy").permissions(), fs::perms(0500));
     for (const std::string& other : {directory / "link", directory / "hard", fifo, std::string("/dev/null")}) {
         EXPECT_FALSE(HkFile::copy(old.c_str(), other.c_str())) << other;
     }

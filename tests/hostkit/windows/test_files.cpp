@@ -31,16 +31,6 @@ TEST(TreeRemoval, RemovesProtectedFilesAndGoesOnPastThoseInUse) {
     EXPECT_TRUE(HkFile::rmtree((directory / "tree\\").c_str()) && !HkFile::exist((directory / "tree").c_str()));
 }
 
-TEST(TreeRemoval, RemovesDeepTrees) {
-    const TemporaryDirectory directory;
-    std::string path = directory / "deep";
-    for (int depth = 0; depth < 300; ++depth) {
-        ASSERT_TRUE(HkFile::mkdir(path.c_str(), false)) << depth;
-        path += "/dir";
-    }
-    EXPECT_TRUE(HkFile::rmtree((directory / "deep").c_str()));
-}
-
 // The runtime that the tests have shows links of its own host as reparse points, but cannot make or remove any.
 TEST(TreeRemoval, StopsAtReparsePoints) {
     const TemporaryDirectory directory;
