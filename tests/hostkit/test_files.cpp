@@ -3,22 +3,15 @@
 #include <cstring>
 #include <set>
 #include <string>
-#include <tuple>
+#include <utility>
 
 #include "HkDir.h"
 #include "HkEnv.h"
 #include "HkFile.h"
 #include "HkMemory.h"
 #include "HkPath.h"
+#include "HkStr.h"
 #include "TemporaryDirectory.h"
-
-// The sanitizers end a program that asks for more than there is, unless they are told to refuse as the hosts do.
-extern "C" const char* __asan_default_options() {  // NOLINT(bugprone-reserved-identifier): their name for it
-    return "allocator_may_return_null=1";
-}
-extern "C" const char* __tsan_default_options() {  // NOLINT(bugprone-reserved-identifier): their name for it
-    return "allocator_may_return_null=1";
-}
 
 namespace {
 
@@ -35,35 +28,30 @@ Names namesIn(const std::string& path, const char* pattern = "*.*", unsigned cha
     return names;
 }
 
-TEST(HkPath, FindsTheExtension) {
-    // A path, its extension or null, and what of that fits into a buffer.
-    const std::tuple<const char*, const char*, const char*> cases[] = {
-        {"", nullptr, ""},   {"a.", nullptr, ""},    {"a.elf", "elf", "elf"},  {"a.1234567", "1234567", "1234567"},
-        {".x", nullptr, ""}, {"d/.x.y", "y", "y"},   {"a.tar.gz", "gz", "gz"}, {"a.12345678", "12345678", "1234567"},
-        {"..", nullptr, ""}, {"d.d/a", nullptr, ""}, {"dir.d\\a.m", "m", "m"},
+TEST(HkPath, FindsTheExtensionAndCopiesWhatFits) {
+    const std::pair<const char*, const char*> cases[] = {
+        {"", nullptr},   {"a.", nullptr}, {"a.elf", "elf"},   {"a.1234567", "1234567"},   {"dir.d\\a.m", "m"},
+        {".x", nullptr}, {"d/.x.y", "y"}, {"d.d/a", nullptr}, {"a.12345678", "12345678"}, {"a.tar.gz", "gz"},
     };
-    for (const auto& [path, extension, cut] : cases) {
+    for (const auto& [path, extension] : cases) {
         SCOPED_TRACE(path);
-        EXPECT_STREQ(HkPath::GetExt(path, nullptr), extension);
         std::string writable(path);
-        char buffer[HkPath::extensionSize + 1];
-        std::memset(buffer, '#', sizeof buffer);
-        EXPECT_EQ(HkPath::GetExt(writable.data(), buffer) == nullptr, extension == nullptr);
-        EXPECT_STREQ(buffer, cut);
-        EXPECT_EQ(buffer[HkPath::extensionSize], '#');
+        std::string buffer(HkPath::extensionSize + 1, '#');
+        EXPECT_STREQ(HkPath::GetExt(writable.data(), buffer.data()), extension);
+        EXPECT_STREQ(buffer.c_str(), std::string(HkStr::View(extension)).substr(0, HkPath::extensionSize - 1).c_str());
+        EXPECT_EQ(buffer.back(), '#');
     }
     EXPECT_EQ(HkPath::GetExt(static_cast<const char*>(nullptr), nullptr), nullptr);
 }
 
 TEST(HkDir, ListsEveryEntryButItselfAndItsParent) {
     const TemporaryDirectory directory;
-    const Names files = {"a.txt", "B.TXT", ".hidden", unicodeName};
-    for (const std::string& name : files) {
+    directory.make("sub");
+    for (const std::string& name : Names{"a.txt", "B.TXT", ".hidden", unicodeName}) {
         directory.write(name, "");
     }
-    EXPECT_EQ(namesIn(directory.path()), files);
-    directory.make("sub");
-    EXPECT_EQ(namesIn(directory.path() + "\\", nullptr), (Names{"a.txt", "B.TXT", ".hidden", "sub", unicodeName}));
+    EXPECT_EQ(namesIn(directory.path() + "\\"), (Names{"a.txt", "B.TXT", ".hidden", "sub", unicodeName}));
+    EXPECT_EQ(namesIn(directory.path(), nullptr).size(), 5U);
     EXPECT_EQ(namesIn(directory.path(), "*.txt"), (Names{"a.txt", "B.TXT", unicodeName}));
     EXPECT_EQ(namesIn(directory.path(), "none"), Names());
 #if !defined(_WIN32)
@@ -155,8 +143,6 @@ TEST(HkMemory, GrowsAndKeepsTheContent) {
     void* block = hk_realloc(hk_malloc(0), 5);
     std::memcpy(block, "abcd", 5);
     block = hk_realloc(block, 100000);
-    volatile std::size_t everything = SIZE_MAX / 4;  // more than any host has
-    EXPECT_TRUE(hk_realloc(block, everything) == nullptr && hk_malloc(everything) == nullptr);
     EXPECT_STREQ(static_cast<const char*>(block), "abcd");
     block = hk_realloc(block, 0);
     ASSERT_NE(block, nullptr);

@@ -23,7 +23,6 @@ using testing::_;
 using testing::ElementsAre;
 using testing::FieldsAre;
 using testing::IsNull;
-using testing::Pair;
 using testing::StrEq;
 
 constexpr UnitOrigin origin{"../s/Some", "$Revision: 1.8 $"};
@@ -47,22 +46,28 @@ void debugLine() {
     HkMessageManager::debugStub("debug %d\n", 1);
 }
 
-TEST(MessageManager, SendsEachLevelToItsPlaceAndDebugLinesWhileTracedOrHandled) {
-    EnvironmentVariable trace(traceVariable, nullptr);
+TEST(MessageManager, SendsEachLevelToItsPlaceAndTheConsoleWritesAmongThem) {
     const auto reportAll = [] {
         origin.report().issueStatus("%d", 1);
         origin.report().issueStatus(" no line end");
+        HkFile::getCout() << "" << -12 << static_cast<const char*>(nullptr) << HkStream::endl << "text";
         origin.report().issueInfo("info %s\n", "text");
         origin.report().issueError("error 100%%\n");
-        debugLine();
     };
-    EXPECT_FALSE(HkMessageManager::refreshTrace() || HkMessageManager::isDebugHeard());
-    EXPECT_EQ(printedBy(reportAll), Printed("1 no line end", "info text\nerror 100%\n"));
-    trace.set("oN");
-    EXPECT_TRUE(HkMessageManager::refreshTrace() && HkMessageManager::isDebugHeard());
-    EXPECT_EQ(printedBy(debugLine), Printed("", "debug 1\n"));
-    trace.set("OFF");
-    HkMessageManager::refreshTrace();
+    EXPECT_EQ(printedBy(reportAll), Printed("1 no line end-12\ntext", "info text\nerror 100%\n"));
+}
+
+TEST(MessageManager, DebugLinesAndTracesGoOutWhileTheVariableReadsOnOrAHandlerHears) {
+    EnvironmentVariable trace(traceVariable, nullptr);
+    for (const auto& [value, isOn] :
+         {std::pair("ON", true), {"", false}, {"1", false}, {"oN", true}, {"ONE", false}, {nullptr, false}}) {
+        trace.set(value);
+        const DebugTrace object;
+        trace.set(isOn ? nullptr : "ON");  // too late
+        EXPECT_EQ(HkMessageManager::isDebugHeard(), isOn);
+        EXPECT_EQ(printedBy([&] { object.print("n %d", 5); }), Printed(isOn ? "n 5" : "", ""));
+        EXPECT_EQ(printedBy(debugLine), Printed("", isOn ? "debug 1\n" : ""));
+    }
     const MessageRecorder recorder;
     debugLine();
     EXPECT_EQ(recorder.debug(), Texts{"debug 1\n"});
@@ -128,25 +133,7 @@ TEST(MessageManager, ServesThreadsOneMessageAtATime) {
     for (const RecordedMessage& message : recorder.all()) {
         ASSERT_EQ(message.text, std::to_string(next[message.file]++)) << "of " << message.file;
     }
-    EXPECT_THAT(next, ElementsAre(Pair("a", 5000), Pair("b", 5000), Pair("c", 5000), Pair("d", 5000)));
-}
-
-TEST(DebugTrace, PrintsIfTheVariableReadOnWhenItWasBuilt) {
-    EnvironmentVariable trace(traceVariable, nullptr);
-    for (const char* const value : {"", "1", "ONE", "ON", "oN"}) {
-        trace.set(value);
-        const bool isOn = HkStr::ICompare(value, "ON") == 0;
-        const DebugTrace object;
-        trace.set(isOn ? nullptr : "ON");
-        EXPECT_EQ(printedBy([&] { object.print("n %d", 5); }), Printed(isOn ? "n 5" : "", "")) << value;
-    }
-    HkMessageManager::refreshTrace();
-}
-
-TEST(Console, ChainsTextsNumbersAndLineEnds) {
-    const char* const nothing = nullptr;
-    const auto chain = [&] { HkFile::getCout() << "Size " << -12 << nothing << HkStream::endl << "" << 0; };
-    EXPECT_EQ(printedBy(chain), Printed("Size -12\n0", ""));
+    EXPECT_EQ(next, (std::map<std::string, int>{{"a", 5000}, {"b", 5000}, {"c", 5000}, {"d", 5000}}));
 }
 
 /// The exception can be caught as its base, and a copy of it still tells its own name.

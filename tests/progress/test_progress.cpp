@@ -3,6 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <iterator>
 #include <limits>
 #include <sstream>
 #include <string>
@@ -68,13 +69,11 @@ TEST_F(Progress, UpdatesOfTheSamePercentAreHeldBackUntilASilenceOfMoreThanTenSec
     // are computed in 32 bits: each of the last three is 0, as the one before them.
     constexpr int late = most - 5000;
     constexpr int wrapped = least + 5999;
-    const std::tuple<int, int, int, bool> updates[] = {{1, 5, 100, true},           {500, 5, 100, false},
-                                                       {11499, 5, 100, false},      {22499, 5, 100, true},
-                                                       {33498, 5, 100, false},      {-66502, 5, 100, false},
-                                                       {-66502, 6, 100, true},      {late, 7, 100, true},
-                                                       {late, 7, 100, false},       {wrapped, 7, 100, true},
-                                                       {wrapped, 0, 200, true},     {wrapped, 1, 200, false},
-                                                       {wrapped, least, -1, false}, {wrapped, 1 << 25, 1 << 30, false}};
+    const std::tuple<int, int, int, bool> updates[] = {
+        {1, 5, 100, true},           {500, 5, 100, false},           {11499, 5, 100, false},  {22499, 5, 100, true},
+        {33498, 5, 100, false},      {-66502, 5, 100, false},        {-66502, 6, 100, true},  {late, 7, 100, true},
+        {late, 7, 100, false},       {wrapped, 7, 100, true},        {wrapped, 0, 200, true}, {wrapped, 1, 200, false},
+        {wrapped, least, -1, false}, {wrapped, 1 << 25, most, false}};
     for (const auto& [time, count, total, isThrough] : updates) {
         now = time;
         Callback progress;
@@ -115,7 +114,6 @@ TEST_F(Progress, IsLostWithoutARecord) {
     EXPECT_TRUE(Funnel::startProgressUpdate(5) && Funnel::updateProgress() && Funnel::setProgressText("x") &&
                 Funnel::endProgressUpdate() && Funnel::stopProgressUpdate());
     Funnel::setTessalMode(tESSALNS::MODE_TYPE(1));
-    Funnel::setTessalSubMode(tESSALNS::SUBMODE_TYPE(1));
     Funnel::m_cbData = kept;
     EXPECT_THAT(calls, IsEmpty());
 }
@@ -132,9 +130,7 @@ TEST(CallbackRecord, StreamsThreeNumbersAndItsTextOfWhichTheNumbersAreRead) {
     Callback back;
     back.readStream(stream);
     EXPECT_EQ(std::tuple(back.getTotalCount(), back.getCurrentCount(), back.getProgressStatus()), std::tuple(10, 3, 2));
-    std::string rest;
-    stream >> rest;
-    EXPECT_EQ(rest, "x");
+    EXPECT_EQ(std::string(std::istreambuf_iterator<char>(stream), {}), "\nx\n");
 }
 
 TEST(DataFileCallback, TheUsersInputMaySuppressTheCall) {
