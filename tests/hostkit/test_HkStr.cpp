@@ -33,8 +33,7 @@ TEST(HkStr, TakesNullAsTheEmptyTextAndKeepsToTheCount) {
 
 TEST(HkStr, PrintsNumbersOf32BitsByLongFormats) {
     char text[80];
-    const int low = -0x65432110;  // 9abcdef0
-    HkStr::SPrintf(text, "l %1lx|%-9ld|%llx|%%lx|%lc", low, -1, 0x123456789ULL, 'c');
+    HkStr::SPrintf(text, "l %1lx|%-9ld|%llx|%%lx|%lc", 0x9abcdef0U, -1, 0x123456789ULL, 'c');
     EXPECT_STREQ(text, "l 9abcdef0|-1       |123456789|%lx|c");
 }
 

@@ -62,11 +62,8 @@ TEST(HkDir, ListsEveryEntryButItselfAndItsParent) {
     EXPECT_EQ(++entry, HkDir("", 1).end());
     EXPECT_EQ(++entry, HkDirIterator());
     EXPECT_STREQ(*copy, "a.txt");
-    const std::string absent = directory / "absent";
-    for (const char* path : {absent.c_str(), "", static_cast<const char*>(nullptr)}) {
-        const HkDir none(path, 1);
-        EXPECT_EQ(none.begin("*.*"), none.end());
-    }
+    EXPECT_TRUE(namesIn(directory / "absent").empty() && namesIn("").empty());
+    EXPECT_EQ(HkDir(nullptr, 1).begin("*.*"), HkDirIterator());
 }
 
 TEST(HkFile, NamesNothingByNullOrTheEmptyText) {
@@ -78,14 +75,25 @@ TEST(HkFile, NamesNothingByNullOrTheEmptyText) {
     EXPECT_TRUE(HkFile::open("name", nullptr) == nullptr && HkEnv::GetEnv(nullptr) == nullptr);
 }
 
-// The file is deep, its path long, its name outside ASCII.
+TEST(HkFile, MakesAndRemovesDeepDirectories) {
+    const TemporaryDirectory directory;
+    std::string deep = directory.path();
+    for (int depth = 0; depth < 150; ++depth) {
+        deep += "/dir\\dir";
+    }
+    EXPECT_FALSE(HkFile::mkdir(deep.c_str(), false));
+    EXPECT_TRUE(HkFile::mkdir((deep + "//last/").c_str(), true) && HkFile::isdir((deep + "/last").c_str()));
+    EXPECT_TRUE(HkFile::mkdir(deep.c_str(), true));
+    EXPECT_FALSE(HkFile::mkdir(deep.c_str(), false));
+    EXPECT_TRUE(HkFile::rmdir((deep + "/last").c_str()) && HkFile::rmtree((directory / "dir").c_str()));
+    const std::string file = directory.write("file", "");
+    EXPECT_FALSE(HkFile::mkdir(file.c_str(), true) || HkFile::mkdir((file + "/below").c_str(), true));
+}
+
+// The path of the file is long, its name outside ASCII.
 TEST(HkFile, TellsFilesFromDirectories) {
     const TemporaryDirectory directory;
-    std::string top = directory.path();
-    for (int depth = 0; depth < 300; ++depth) {
-        top += "/dir";
-    }
-    ASSERT_TRUE(HkFile::mkdir(top.c_str(), true));
+    const std::string top = directory.make(std::string(200, 'n') + "/" + std::string(200, 'n'));
     const std::string file = top + "/" + unicodeName;
     const std::string absent = top + "/absent";
     std::FILE* const opened = HkFile::open(file.c_str(), "wb");
@@ -102,19 +110,6 @@ TEST(HkFile, TellsFilesFromDirectories) {
     EXPECT_FALSE(HkFile::rmdir(top.c_str())) << "not empty";
     EXPECT_TRUE(HkFile::remove_f(file.c_str()));
     EXPECT_FALSE(HkFile::remove_f(file.c_str()));
-    EXPECT_TRUE(HkFile::rmtree((directory / "dir").c_str()));
-}
-
-TEST(HkFile, MakesDirectories) {
-    const TemporaryDirectory directory;
-    const std::string deep = directory / "a\\b/c//d/";
-    EXPECT_FALSE(HkFile::mkdir(deep.c_str(), false));
-    EXPECT_TRUE(HkFile::mkdir(deep.c_str(), true) && HkFile::isdir((directory / "a/b/c/d").c_str()));
-    EXPECT_TRUE(HkFile::mkdir(deep.c_str(), true));
-    EXPECT_FALSE(HkFile::mkdir((directory / "a").c_str(), false));
-    EXPECT_TRUE(HkFile::rmdir((directory / "a/b/c/d").c_str()));
-    const std::string file = directory.write("file", "");
-    EXPECT_FALSE(HkFile::mkdir(file.c_str(), true) || HkFile::mkdir((file + "/below").c_str(), true));
 }
 
 TEST(HkFile, CopiesContentAndLeavesEverythingAsItWasWhereItFails) {

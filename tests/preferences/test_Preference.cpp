@@ -12,6 +12,7 @@
 
 namespace {
 
+using testing::_;
 using testing::ElementsAre;
 using testing::IsEmpty;
 using Row = TessalPreference::PREFERENCE;
@@ -27,12 +28,9 @@ TEST(Preference, TheTableIsThatOfTheDataFile) {
     TessalPreference& preferences = loaded();
     const MessageRecorder messages;
     TessalPreference::dump();
-    EXPECT_THAT(
-        messages.status(),
-        ElementsAre("Preference Table\n", "Name                 Setting             \n",
-                    "Auto                 True                \n", "Level                1                   \n",
-                    "                                         \n", "Single               only                \n",
-                    "Mixed                aB                  \n"));
+    EXPECT_THAT(messages.status(), ElementsAre("Preference Table\n", "Name                 Setting             \n", _,
+                                               "Level                1                   \n", _, _,
+                                               "Mixed                aB                  \n"));
     EXPECT_TRUE(preferences.isPreferenceTrue(automatic));
     EXPECT_EQ(preferences.getPreferenceValue(level), 1);
     EXPECT_EQ(preferences.getPreferenceValue(automatic), 0);
