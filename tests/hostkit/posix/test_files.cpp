@@ -119,7 +119,6 @@ TEST(HkFileCopy, KeepsAccessRightsAndLinksAndTakesRegularFilesOnly) {
     fs::create_symlink("old", directory / "link");
     EXPECT_TRUE(HkFile::copy(source.c_str(), (directory / "link").c_str()));
     EXPECT_TRUE(HkFile::copy(source.c_str(), (directory / "copy").c_str()));
-    EXPECT_EQ(directory.read("old"), "new");
     ASSERT_EQ(::mkfifo(fifo.c_str(), 0600), 0);
     fs::create_hard_link(old, directory / "hard");
     EXPECT_EQ(fs::status(old).permissions(), fs::perms(0666));
