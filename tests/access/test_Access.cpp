@@ -16,6 +16,7 @@
 using testing::AnyOf;
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::StartsWith;
 
 namespace {
 
@@ -82,6 +83,22 @@ TEST(AccessCount, CountsFiveClients) {
     EXPECT_EQ(access.incCount(), 1);
     EXPECT_EQ(access.getNormalizedCount(), 4);
     EXPECT_EQ(messages.status().size(), 1U);
+}
+
+TEST(Access, TellsItsWorkInDebugLines) {
+    const int port = freshPort();
+    const MessageRecorder messages;
+    Access::generatePortId("LPT1", 0, Access::SHARE);
+    Access first(port, Access::COUNT);
+    const Access second(port, Access::COUNT);
+    first.incCount();
+    first.getNormalizedCount();
+    const std::string name = " Semaphore name = CableShareCount" + std::to_string(port) + ".\n";
+    EXPECT_THAT(messages.debug(),
+                ElementsAre(" Generating id for LPT1, port 0. share type = SHARE\n",
+                            "Invalid port name: LPT1. shar type = 0.\n", name, StartsWith(" Creating semaphore, id=0x"),
+                            name, StartsWith(" Reusing semaphore, id=0x"), " Cable Client Count = 5.\n",
+                            " Cable Normalized Count = 0.\n"));
 }
 
 TEST(Access, CopiesAreIndependentAndHoldNothing) {
