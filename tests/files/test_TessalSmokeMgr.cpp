@@ -31,4 +31,11 @@ TEST(TessalSmokeMgr, WritesNowhereWithoutAFile) {
     }
 }
 
+#if defined(__linux__)
+TEST(TessalSmokeMgr, SurvivesAFullDisk) {
+    TessalSmokeMgr status("/dev/full");
+    EXPECT_TRUE(status.smokeStatus("%s", std::string(1 << 20, 'x').c_str()));
+}
+#endif
+
 }  // namespace
