@@ -36,6 +36,7 @@ fi
 
 cp "$here/batch/demo.batch" "$here/batch/boot.mem" "$work"
 cd "$work"
+: >address  # so that it is there before the device's shell has opened it
 "${device[@]}" "${where[@]}" --content prom "$@" >address 2>&1 </dev/null &
 served=$!
 for ((tries = 0; tries < 500; ++tries)); do
