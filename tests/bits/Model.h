@@ -8,6 +8,8 @@
 #include <string_view>
 #include <vector>
 
+#include "RLBitVec.h"
+
 enum class Numbering { Storage, Usual, Forward, Mirrored };
 
 /// The value of a hex digit; -1 for any other character.
@@ -24,6 +26,11 @@ struct Model {
 
     Model() = default;
     Model(const Model&) = default;
+    explicit Model(const RLBitVec& vector, Numbering chosen = Numbering::Usual)
+        : capacity(vector.getCapacity()),
+          length(vector.length()),
+          bytes(vector.data(), vector.data() + vector.nbytes()),
+          numbering(chosen) {}
     explicit Model(std::size_t bits) : capacity(bits + 7), length(bits), bytes((bits + 14) / 8) {}
 
     bool bit(std::size_t p) const { return (bytes.at(p / 8) >> (p % 8) & 1) != 0; }

@@ -4,19 +4,7 @@
 
 #include "HkString.h"
 #include "Register.h"
-
-namespace {
-
-struct Forward : RLBitVec {
-    using RLBitVec::RLBitVec;
-    void choose() { m_forwardIndex = 1; }
-};
-struct ByteMirror : RLBitVec {
-    using RLBitVec::RLBitVec;
-    void choose() { m_byteMirrorIndex = 1; }
-};
-
-}  // namespace
+#include "hex/HexModel.h"
 
 const unsigned char bytes[] = {0xA5, 0x0C};
 
@@ -33,8 +21,8 @@ LRBitVec movedLeft(bytes, 12);
 LRBitVec longLeft(1000, true);
 RLBitVec right(bytes, 12);
 RLBitVec longRight(1001);
-Forward forward(bytes, 12);
-ByteMirror byteMirror(bytes, 12);
+HexModel::NumberedVec forward(right, Numbering::Forward);
+HexModel::NumberedVec byteMirror(right, Numbering::Mirrored);
 alignas(RLBitVec) unsigned char noVector[sizeof(RLBitVec)];
 alignas(RLBitVec) unsigned char wildVector[sizeof(RLBitVec)];
 
@@ -51,8 +39,6 @@ int main() {
     const HkString newText(std::move(movedText));
     const LRBitVec newLeft(std::move(movedLeft));
     longRight.setBit(1);
-    forward.choose();
-    byteMirror.choose();
     std::memset(wildVector, 0x55, sizeof wildVector);
     shown();
 }

@@ -1,4 +1,4 @@
-// Paths of any form against the state table of the front, walked character by character.
+// Paths of any form against a plain model, which takes one element after the other off the front.
 #include <optional>
 #include <string>
 
@@ -8,37 +8,33 @@
 
 namespace {
 
-bool isSeparator(char ch) {
-    return ch == '/' || ch == '\\';
+constexpr const char* separators = "/\\";
+
+/// The directory so many levels above; the root itself where there are not so many.
+std::string above(const std::string& root, int levels) {
+    std::string result = root;
+    for (; levels > 0; --levels) {
+        const std::size_t end = result.find_last_of(separators);
+        if (end == std::string::npos) {
+            return root;
+        }
+        result.erase(end);
+    }
+    return result;
 }
 
-enum class State { Start, OneDot, TwoDots };
-
 /// The expected result, or nothing for an illegal path.
-std::optional<std::string> convertBySteps(const std::string& path, const std::string& root) {
-    State state = State::Start;
+std::optional<std::string> convertByElements(std::string path, const std::string& root) {
     int levels = 0;
-    std::size_t i = 0;
-    for (; i < path.size() && !(state == State::Start && path[i] != '.' && !isSeparator(path[i])); ++i) {
-        if (path[i] == '.') {
-            if (state == State::TwoDots) {
-                return std::nullopt;
-            }
-            state = state == State::Start ? State::OneDot : State::TwoDots;
-        } else if (isSeparator(path[i])) {
-            levels += state == State::TwoDots ? 1 : 0;
-            state = State::Start;
-        } else {
-            return std::nullopt;
-        }
+    std::size_t end = path.find_first_of(separators);
+    for (; end == path.find_first_not_of('.') && end <= 2; end = path.find_first_of(separators)) {
+        levels += end == 2 ? 1 : 0;
+        path.erase(0, end + 1);
     }
-    std::size_t end = root.size();
-    for (std::size_t at = root.size(); levels > 0 && at-- > 0;) {
-        if (isSeparator(root[at]) && --levels == 0) {
-            end = at;
-        }
+    if (path == "." || path == "..") {
+        path.clear();
     }
-    return root.substr(0, end) + "/" + path.substr(i);
+    return path[0] != '.' ? std::optional(above(root, levels) + "/" + path) : std::nullopt;
 }
 
 }  // namespace
@@ -47,9 +43,10 @@ std::optional<std::string> convertBySteps(const std::string& path, const std::st
 void fuzz(Input input) {
     const std::string path = input.line();
     const std::string base = input.text();
-    const bool isAbsolute = (!path.empty() && isSeparator(path[0])) || path.find(':') != std::string::npos;
-    const bool isAbove = path.rfind("../", 0) == 0 || path.rfind("..\\", 0) == 0;
+    const std::size_t front = path.find_first_of(separators);
+    const bool isAbsolute = front == 0 || path.find(':') != std::string::npos;
+    const bool isAbove = front == 2 && path.rfind("..", 0) == 0;
     const std::string root = isAbove || base.empty() ? HkFile::getcwd().c_str() : base;
-    const std::string expected = isAbsolute ? path : convertBySteps(path, root).value_or(path);
+    const std::string expected = isAbsolute ? path : convertByElements(path, root).value_or(path);
     require(expected == FileUtility::convertPath(path.c_str(), base.c_str()).c_str());
 }

@@ -7,10 +7,7 @@
 
 namespace {
 
-struct Separators {
-    const char* row;
-    const char* field;
-};
+using Separators = std::pair<const char*, const char*>;
 constexpr Separators separators[] = {{":", ","}, {",", ""}, {"", ","}, {"", ""}, {"::", "ab"}, {",", ","}};
 constexpr int mostIndexes = 40;
 
@@ -24,10 +21,11 @@ DeviceProfile::FileText fileText(const std::string& bytes) {
 }
 
 void checkCells(CellStore& store, const std::string& key, const std::string& value, const Separators& split) {
+    const auto& [rowSeparator, fieldSeparator] = split;
     for (int row = -1; row < mostIndexes; ++row) {
         for (int field = -1; field < mostIndexes; ++field) {
-            const char* const cell = store.cell(key.c_str(), split.row, row, split.field, field);
-            const auto expected = modelCell(value, split.row, row, split.field, field);
+            const char* const cell = store.cell(key.c_str(), rowSeparator, row, fieldSeparator, field);
+            const auto expected = modelCell(value, rowSeparator, row, fieldSeparator, field);
             require((cell != nullptr) == expected.has_value() && (cell == nullptr || *expected == cell));
             if (!expected && field >= 0) {
                 break;

@@ -24,22 +24,16 @@ bool matchByModel(const std::string& text, const std::string& pattern, bool hasW
     return matches.back();
 }
 
-bool drop(std::string& text, char prefix) {
-    const bool isThere = !text.empty() && text[0] == prefix;
-    text.erase(0, isThere ? 1 : 0);
-    return isThere;
-}
-
 }  // namespace
 
 /// The input is a pattern and, behind its first line end, a text.
 void fuzz(Input input) {
-    const std::string whole = input.line();
+    const std::string pattern = input.line();
     const std::string text = input.text();
-    std::string pattern = whole;
-    const DeviceIdPattern parsed = parseDeviceIdPattern(whole.c_str());
-    const bool isInstanceId = drop(pattern, '@');
-    const bool isLiteral = drop(pattern, '\'');
-    require((parsed.m_isInstanceId != 0) == isInstanceId);
-    require(matchDeviceId(text.c_str(), parsed) == matchByModel(text, pattern, !isLiteral));
+    const DeviceIdPattern parsed = parseDeviceIdPattern(pattern.c_str());
+    const std::size_t instance = pattern[0] == '@' ? 1 : 0;
+    const std::size_t literal = pattern[instance] == '\'' ? 1 : 0;
+    require((parsed.m_isInstanceId != 0) == (instance != 0));
+    require(matchDeviceId(text.c_str(), parsed) ==
+            matchByModel(text, pattern.substr(instance + literal), literal == 0));
 }

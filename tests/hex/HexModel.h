@@ -1,6 +1,8 @@
 // The conversions as their rules read, bit by bit, for the tests and fuzz targets to compare with.
 #pragma once
 
+#include <algorithm>
+#include <bitset>
 #include <cstdint>
 #include <string>
 #include <vector>
@@ -10,26 +12,18 @@
 
 namespace HexModel {
 
-/// An RLBitVec whose numbering can be chosen, filled with one value.
+/// An RLBitVec whose numbering can be chosen.
 struct NumberedVec : RLBitVec {
-    NumberedVec(std::size_t length, Numbering numbering, bool fill = false) : RLBitVec(length, fill) {
-        m_forwardIndex = numbering == Numbering::Forward ? 1 : 0;
-        m_byteMirrorIndex = numbering == Numbering::Mirrored ? 1 : 0;
+    NumberedVec(const RLBitVec& bits, Numbering chosen) : RLBitVec(bits), numbering(chosen) {
+        m_forwardIndex = chosen == Numbering::Forward ? 1 : 0;
+        m_byteMirrorIndex = chosen == Numbering::Mirrored ? 7 : 0;
     }
+    NumberedVec(std::size_t length, Numbering chosen) : NumberedVec(RLBitVec(length), chosen) {}
+
+    const Numbering numbering;
 };
 
 constexpr Numbering numberings[] = {Numbering::Usual, Numbering::Forward, Numbering::Mirrored};
-
-inline std::vector<unsigned char> arrayOf(const RLBitVec& vector) {
-    return {vector.data(), vector.data() + vector.nbytes()};
-}
-
-inline Model modelOf(const RLBitVec& vector, Numbering numbering = Numbering::Usual) {
-    Model model(vector.length());
-    model.numbering = numbering;
-    model.bytes = arrayOf(vector);
-    return model;
-}
 
 inline unsigned char mirrored(unsigned char byte) {
     unsigned result = 0;
@@ -64,13 +58,17 @@ inline void loadBinary(Model& model, const std::string& text, int size, bool des
     }
 }
 
-/// The first bits of an array as binary text, from position 0 up or from the last bit down.
-inline std::string binaryText(const unsigned char* data, int count, bool positionOrder) {
+/// The bits as binary text, from index 0 on; so it reads as a number.
+inline std::string binaryText(const Model& model) {
     std::string text;
-    for (int i = 0; i < count; ++i) {
-        const int p = positionOrder ? i : count - 1 - i;
-        text += (data[p / 8] >> p % 8 & 1) != 0 ? '1' : '0';
+    for (std::size_t index = 0; index < model.length; ++index) {
+        text += model.read(index) ? '1' : '0';
     }
+    return text;
+}
+
+inline std::string turned(std::string text) {
+    std::reverse(text.begin(), text.end());
     return text;
 }
 
@@ -79,24 +77,18 @@ inline std::string hexText(std::string binary, bool byteMode) {
     binary.resize((binary.size() + group - 1) / group * group, '0');
     std::string hex;
     for (std::size_t first = 0; first < binary.size(); first += group) {
-        for (std::size_t digit = group; digit > 0; digit -= 4) {
-            std::size_t value = 0;
-            for (std::size_t bit = 0; bit < 4; ++bit) {
-                value = 2 * value + (binary[first + (byteMode ? digit - 1 - bit : bit)] == '1' ? 1 : 0);
-            }
-            hex += "0123456789abcdef"[value];
-        }
+        const std::string bits = binary.substr(first, group);
+        const unsigned long value = std::stoul(byteMode ? turned(bits) : bits, nullptr, 2);
+        hex += byteMode ? std::string(1, "0123456789abcdef"[value / 16]) : "";
+        hex += "0123456789abcdef"[value % 16];
     }
     return hex;
 }
 
-/// The vector as a number from index 0 on, by the accumulator that keeps 31 bits.
-inline int number(const Model& model) {
-    std::uint32_t accumulator = 0;
-    for (std::size_t index = 0; index < model.length; ++index) {
-        accumulator = (accumulator + (model.read(index) ? 1U : 0U)) * 2;
-    }
-    return static_cast<int>(accumulator >> 1);
+/// The number that the last 31 digits are.
+inline int number(const std::string& binary) {
+    const std::size_t dropped = binary.size() - std::min<std::size_t>(binary.size(), 31);
+    return static_cast<int>(std::bitset<31>(binary, dropped).to_ulong());
 }
 
 inline void writeNumber(Model& model, std::uint32_t value, bool fromIndexZero) {
@@ -106,13 +98,9 @@ inline void writeNumber(Model& model, std::uint32_t value, bool fromIndexZero) {
 }
 
 /// The vector's characters from index 0 on; false when one above 127 ended it.
-inline bool characters(const Model& model, bool stopAtNonAscii, std::string& text) {
-    text.clear();
-    for (std::size_t first = 0; first + 8 <= model.length; first += 8) {
-        unsigned value = 0;
-        for (std::size_t bit = 0; bit < 8; ++bit) {
-            value = 2 * value + (model.read(first + bit) ? 1U : 0U);
-        }
+inline bool characters(const std::string& binary, bool stopAtNonAscii, std::string& text) {
+    for (std::size_t first = 0; first + 8 <= binary.size(); first += 8) {
+        const unsigned long value = std::stoul(binary.substr(first, 8), nullptr, 2);
         if (value > 127 && stopAtNonAscii) {
             return false;
         }
@@ -123,13 +111,11 @@ inline bool characters(const Model& model, bool stopAtNonAscii, std::string& tex
     return true;
 }
 
-/// Hex digits of the vector from the address up, in byte mode.
-inline std::string hexAt(const Model& model, std::size_t first, int digits) {
-    std::string binary;
-    for (std::size_t i = 0; i < 4 * static_cast<std::size_t>(digits); ++i) {
-        binary += model.read(model.length - 1 - first - i) ? '1' : '0';
-    }
-    return hexText(binary, true);
+/// Hex digits of the vector from the position up, in byte mode.
+inline std::string hexAt(const std::string& binary, std::size_t position, std::size_t digits) {
+    std::string rising = turned(binary).substr(position);
+    rising.resize(4 * digits, '0');
+    return hexText(rising, true);
 }
 
 }  // namespace HexModel
