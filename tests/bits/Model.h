@@ -6,11 +6,24 @@
 #include <cstdint>
 #include <functional>
 #include <string_view>
+#include <tuple>
 #include <vector>
 
 #include "RLBitVec.h"
 
 enum class Numbering { Storage, Usual, Forward, Mirrored };
+
+/// An RLBitVec whose numbering can be chosen.
+struct NumberedVec : RLBitVec {
+    NumberedVec(const RLBitVec& bits, Numbering chosen) : RLBitVec(bits), numbering(chosen) {
+        m_byteMirrorIndex = chosen == Numbering::Mirrored ? 7 : 0;
+        const bool isEither = m_byteMirrorIndex != 0 && bits.length() % 2 != 0;  // beside the mirror it does not count
+        m_forwardIndex = chosen == Numbering::Forward || isEither ? 1 : 0;
+    }
+    NumberedVec(std::size_t length, Numbering chosen) : NumberedVec(RLBitVec(length), chosen) {}
+
+    const Numbering numbering;
+};
 
 /// The value of a hex digit; -1 for any other character.
 inline int digitValue(char character) {
@@ -23,16 +36,18 @@ struct Model {
     std::size_t length = 0;
     std::vector<unsigned char> bytes{0};
     Numbering numbering = Numbering::Storage;
+    bool appendsInverted = false;
 
     Model() = default;
     Model(const Model&) = default;
-    explicit Model(const RLBitVec& vector, Numbering chosen = Numbering::Usual)
+    explicit Model(const RLBitVec& vector, Numbering chosen = Numbering::Usual, bool inverts = false)
         : capacity(vector.getCapacity()),
           length(vector.length()),
           bytes(vector.data(), vector.data() + vector.nbytes()),
-          numbering(chosen) {}
-    explicit Model(std::size_t bits) : capacity(bits + 7), length(bits), bytes((bits + 14) / 8) {}
+          numbering(chosen),
+          appendsInverted(inverts) {}
 
+    std::tuple<std::size_t, std::size_t, std::vector<unsigned char>> state() const { return {length, capacity, bytes}; }
     bool bit(std::size_t p) const { return (bytes.at(p / 8) >> (p % 8) & 1) != 0; }
     void put(std::size_t p, bool value) {
         unsigned char& byte = bytes.at(p / 8);
@@ -61,12 +76,12 @@ struct Model {
         if (length >= capacity - 1) {
             setCapacity(2 * capacity);
         }
-        put(length++, value);
+        put(length++, value != appendsInverted);
     }
     void concatenate(const Model& other) {
-        const Model source = other;
-        setCapacity(length + source.length + 64);
-        for (const bool value : source.bits()) {
+        const std::vector<bool> added = other.bits();
+        setCapacity(length + added.size() + 64);
+        for (const bool value : added) {
             addBit(value);
         }
     }
@@ -79,6 +94,9 @@ struct Model {
             }
         }
     }
+    void operator+=(bool value) { addBit(value); }
+    void operator+=(const Model& other) { concatenate(other); }
+    void operator+=(const char* text) { addHex(text); }
     void setSize(std::size_t bits, bool value) {
         length = bits;
         for (std::size_t i = 0; i < bits; ++i) {
@@ -126,17 +144,22 @@ struct Model {
         return all;
     }
     Model joined(const Model& other) const {
-        Model result(length + other.length);
+        Model result(RLBitVec(length + other.length));
         for (std::size_t i = 0; i < result.length; ++i) {
-            result.put(result.length - 1 - i, i < length ? read(i) : other.read(i - length));
+            result.write(i, i < length ? read(i) : other.read(i - length));
         }
         return result;
     }
-    void field(std::size_t start, const std::vector<bool>& values) {
-        for (std::size_t k = 0; k < values.size(); ++k) {
-            put(place(length - start - 1 - k), values[k]);
+    // The operators that an RLBitVec has itself; in += the other one's bits come behind the last index.
+    void join(const Model& other) {
+        if (other.length > 0) {
+            Model sum = length > 0 ? joined(other) : other;
+            std::tie(capacity, length) = std::tuple(sum.capacity, sum.length);
+            bytes.swap(sum.bytes);
         }
     }
+    void operator<<(std::size_t n) { rightShift(n); }
+    void operator>>(std::size_t n) { leftShift(n); }
 
 private:
     template <class Operation>

@@ -17,9 +17,7 @@ std::mt19937 randomNumber{5};
 Model array(std::size_t first, std::size_t count) {
     Model model;
     model.bytes.resize((first + count + 7) / 8);
-    for (unsigned char& byte : model.bytes) {
-        byte = static_cast<unsigned char>(randomNumber());
-    }
+    std::generate(model.bytes.begin(), model.bytes.end(), std::ref(randomNumber));
     return model;
 }
 

@@ -1,30 +1,15 @@
 #include <gtest/gtest.h>
 
-#include <regex>
 #include <string>
 #include <tuple>
-#include <vector>
 
 #include "BitView.h"
-#include "EnvironmentVariable.h"
 #include "Register.h"
 
 namespace {
 
 const unsigned char addressBytes[]{0xA5};
 const unsigned char dataBytes[]{0x3C, 0x00};
-
-/// What prints while the call runs.
-template <class Call>
-std::string printed(Call call) {
-    testing::internal::CaptureStdout();
-    call();
-    return testing::internal::GetCapturedStdout();
-}
-
-std::string line(const std::string& title, const std::string& storageBits) {
-    return title + "[\n  " + std::regex_replace(storageBits, std::regex("."), "$& ") + "\n]\n\n";
-}
 
 std::string total(Register& reg) {
     return toGroupedText(*reg.getRegister(), 0);
@@ -95,21 +80,17 @@ TEST(Register, ComparesWithoutTheStatus) {
     EXPECT_FALSE(unmasked == source) << "its mask hides nothing";
 }
 
-TEST(Register, PrintsWhatStandsAndItsWorkWhenTheVariableIsSet) {
-    EnvironmentVariable variable("TESSALREGISTERDUMPDATA", nullptr);
+TEST(Register, PrintsItsPartsAndItsTotal) {
     Register reg(2, 3, 2);
     const RLBitVec data(3, true);
+    testing::internal::CaptureStdout();
     reg.setData(&data);
-    EXPECT_EQ(printed([&] { reg.registerDisplay(); }), line("Register: ", "0000000"));
-    EXPECT_EQ(printed([&] { reg.display(); }), line("Address: ", "00") + line("Data: ", "111") +
-                                                   line("Status: ", "00") + line("Total Register", "0011100"));
-    Register b(1, 1, 1);
-    variable.set("off");
-    Register a(1, 1, 1);
-    EXPECT_EQ(printed([&] { a.setStatus(1); }), line("status: ", "1"));
-    EXPECT_EQ(printed([&] { static_cast<void>(a == b); }),
-              line("Operand1 data ", "000") + line("Mask ", "011") + line("Operand2 data ", "000") +
-                  line("Mask ", "011") + line("&", "000") + line("&", "000") + "ReCalculating ...\n" + line("", "100"));
+    reg.registerDisplay();
+    reg.display();
+    EXPECT_EQ(testing::internal::GetCapturedStdout(),
+              "Register: [\n  0 0 0 0 0 0 0 \n]\n\n"
+              "Address: [\n  0 0 \n]\n\nData: [\n  1 1 1 \n]\n\n"
+              "Status: [\n  0 0 \n]\n\nTotal Register[\n  0 0 1 1 1 0 0 \n]\n\n");
 }
 
 TEST(Register, WithoutVectorsAnswersWithNothing) {
@@ -123,7 +104,7 @@ TEST(Register, WithoutVectorsAnswersWithNothing) {
     EXPECT_EQ(empty.getRegisterSize() + empty.getStatus(), 0);
     EXPECT_TRUE(empty.getData() == nullptr && empty.getStatus(true) == nullptr);
     EXPECT_FALSE(empty == source || source == other);
-    EXPECT_NE(printed([&] { empty.display(); }), "");
+    empty.display();
 }
 
 }  // namespace

@@ -1,6 +1,7 @@
 // What the fuzz targets share: each defines fuzz(), which runs once for each input.
 #pragma once
 
+#include <algorithm>
 #include <cstdlib>
 #include <string>
 #include <string_view>
@@ -23,10 +24,9 @@ public:
     std::string text() const { return std::string(m_left.substr(0, m_left.find('\0'))); }
     /// The text of the next line, which goes without its line end.
     std::string line() {
-        const std::size_t length = m_left.find('\n');
-        const std::string_view whole = m_left.substr(0, length);
-        m_left.remove_prefix(length < m_left.size() ? length + 1 : m_left.size());
-        return std::string(whole.substr(0, whole.find('\0')));
+        const Input line(m_left.substr(0, m_left.find('\n')));
+        m_left.remove_prefix(std::min(line.m_left.size() + 1, m_left.size()));
+        return line.text();
     }
 
 private:

@@ -43,9 +43,8 @@ std::optional<std::string> convertByElements(std::string path, const std::string
 void fuzz(Input input) {
     const std::string path = input.line();
     const std::string base = input.text();
-    const std::size_t front = path.find_first_of(separators);
-    const bool isAbsolute = front == 0 || path.find(':') != std::string::npos;
-    const bool isAbove = front == 2 && path.rfind("..", 0) == 0;
+    const bool isAbsolute = path.find_first_of(separators) == 0 || path.find(':') != std::string::npos;
+    const bool isAbove = path.find_first_of(separators) == 2 && path.rfind("..", 0) == 0;
     const std::string root = isAbove || base.empty() ? HkFile::getcwd().c_str() : base;
     const std::string expected = isAbsolute ? path : convertByElements(path, root).value_or(path);
     require(expected == FileUtility::convertPath(path.c_str(), base.c_str()).c_str());

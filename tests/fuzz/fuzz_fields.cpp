@@ -34,9 +34,8 @@ private:
 
 // Each reads the same field from both; false at the end of the stream, or where a reader would give the connection up.
 
-bool readNumber(MemoryChannel& channel, DataBuffer& buffer) {
+bool readNumber(MemoryChannel& channel, DataBuffer& buffer, int& value) {
     const bool isWhole = channel.left() >= 4;
-    int value = -1;
     require(channel.readInt(&value) == 4);
     require(value == (isWhole ? buffer.readInt() : 0));
     return isWhole;
@@ -50,13 +49,10 @@ bool readTruth(MemoryChannel& channel, DataBuffer& buffer) {
 }
 
 bool readText(MemoryChannel& channel, DataBuffer& buffer) {
-    const bool isAnnounced = channel.left() >= 4;
     int length = 0;
-    channel.readInt(&length);
-    if (!isAnnounced || length < 0 || length > longestText) {
+    if (!readNumber(channel, buffer, length) || length < 0 || length > longestText) {
         return false;
     }
-    require(buffer.readInt() == length);
     const bool isWhole = channel.left() >= length;
     std::string characters(static_cast<std::size_t>(length), '\0');
     require(channel.read(characters.data(), length) == isWhole);
@@ -75,10 +71,13 @@ void fuzz(Input input) {
     DataBuffer buffer(length);
     buffer.write(input.bytes().data(), length);
     buffer.reset();
-    bool (*const readers[])(MemoryChannel&, DataBuffer&) = {readNumber, readTruth, readText, readText};
     for (char kind = 0; channel.read(&kind, 1);) {  // it chooses the field that follows
         require(buffer.readByte() == kind);
-        if (!readers[kind & 3](channel, buffer)) {
+        int value = -1;
+        const bool isWhole = (kind & 2) != 0   ? readText(channel, buffer)
+                             : (kind & 1) != 0 ? readTruth(channel, buffer)
+                                               : readNumber(channel, buffer, value);
+        if (!isWhole) {
             return;
         }
         require(buffer.getLength() == length - channel.left());

@@ -17,24 +17,21 @@ void requireInside(const ImageTools::SegmentMap& segments, const unsigned char* 
     }
 }
 
-void readObjectFile(std::string_view bytes) {
-    const auto* const data = reinterpret_cast<const unsigned char*>(bytes.data());
-    ImageTools::SegmentMap segments;
-    std::string note;
-    if (ImageTools::readElf(ImageTools::ByteSource(data, bytes.size()), segments, note).empty()) {
-        requireInside(segments, data, bytes.size());
-    }
-}
-
 }  // namespace
 
 void fuzz(Input input) {
-    readObjectFile(input.bytes());
+    const auto* const file = reinterpret_cast<const unsigned char*>(input.bytes().data());
+    const std::size_t size = input.bytes().size();
+    ImageTools::SegmentMap ofFile;
+    std::string note;
+    if (ImageTools::readElf(ImageTools::ByteSource(file, size), ofFile, note).empty()) {
+        requireInside(ofFile, file, size);
+    }
     const unsigned flags = input.byte();
     const ImageTools::MemOptions options{(flags & 1U) != 0, (flags & 2U) != 0, (flags & 4U) != 0};
     std::vector<unsigned char> bytes(input.bytes().size() / 2 + 1);
-    ImageTools::SegmentMap segments;
-    if (ImageTools::readMem(input.bytes(), options, bytes.data(), segments).empty()) {
-        requireInside(segments, bytes.data(), input.bytes().size() / 2);
+    ImageTools::SegmentMap ofText;
+    if (ImageTools::readMem(input.bytes(), options, bytes.data(), ofText).empty()) {
+        requireInside(ofText, bytes.data(), input.bytes().size() / 2);
     }
 }

@@ -11,13 +11,11 @@
 
 namespace {
 
-using Words = std::vector<std::string>;
-
 /// The tokens of the line; nothing when the tokeniser refuses it.
-std::optional<Words> split(const std::string& line) {
+std::optional<std::vector<std::string>> split(const std::string& line) {
     try {
         const std::unique_ptr<CommandSet> commands(CommandSet::string2CommandSet(line.c_str()));
-        Words words;
+        std::vector<std::string> words;
         for (int i = 0; commands != nullptr && i < commands->getNumberCommands(); ++i) {
             words.emplace_back(commands->getCommand(i));
         }

@@ -53,24 +53,19 @@ inline bool charactersAgree(std::string_view text, bool descending, bool byteSwa
     return Model(*Hex2Bit::convertString2BitVec(text, descending, byteSwap)).bytes == model.bytes;
 }
 
-/// An array as text of both kinds in both orders, and as a number.
-inline bool bytesAgree(const unsigned char* bytes, int bits) {
+/// An array as text of both kinds, and as a number.
+inline bool bytesAgree(const unsigned char* bytes, int bits, bool positionOrder, bool byteMode) {
     const std::string falling = HexModel::binaryText(Model(RLBitVec(bytes, static_cast<std::size_t>(bits))));
-    bool agrees = Hex2Bit::convertBin2Int(bytes, bits) == HexModel::number(falling) &&
-                  Hex2Bit::convertBin2Long(bytes, bits) == HexModel::number(falling);
-    for (const bool positionOrder : {false, true}) {
-        const std::string binary = positionOrder ? HexModel::turned(falling) : falling;
-        agrees = agrees && taken(Hex2Bit::convertBinData2BinString(bytes, bits, positionOrder)) == binary;
-        for (const bool byteMode : {false, true}) {
-            agrees = agrees && taken(Hex2Bit::convertBinData2HexString(bytes, bits, positionOrder, byteMode)) ==
-                                   HexModel::hexText(binary, byteMode);
-        }
-    }
-    return agrees;
+    const std::string binary = positionOrder ? HexModel::turned(falling) : falling;
+    return Hex2Bit::convertBin2Int(bytes, bits) == HexModel::number(falling) &&
+           Hex2Bit::convertBin2Long(bytes, bits) == HexModel::number(falling) &&
+           taken(Hex2Bit::convertBinData2BinString(bytes, bits, positionOrder)) == binary &&
+           taken(Hex2Bit::convertBinData2HexString(bytes, bits, positionOrder, byteMode)) ==
+               HexModel::hexText(binary, byteMode);
 }
 
 /// The first characters as binary text, and as hex digits of a number, with the fill value that is set.
-inline bool textAgrees(const std::string& text, int count) {
+inline bool textAgrees(const std::string& text, int count, bool byteMode) {
     const auto characters = static_cast<std::size_t>(count);
     std::string binary(characters, '0');
     std::transform(text.begin(), text.begin() + std::min(count, static_cast<int>(text.size())), binary.begin(),
@@ -78,41 +73,33 @@ inline bool textAgrees(const std::string& text, int count) {
     Model model(RLBitVec(4 * characters, Hex2Bit::m_initValue));
     HexModel::loadHex(model, text, 4 * count, false, false);
     const int number = HexModel::number(HexModel::binaryText(model));
-    bool agrees = Hex2Bit::convertHexString2Int(text.c_str(), count) == number &&
-                  Hex2Bit::convertHexString2Long(text.c_str(), count) == number;
-    for (const bool byteMode : {false, true}) {
-        agrees = agrees && taken(Hex2Bit::convertBinString2HexString(text.c_str(), count, byteMode)) ==
-                               HexModel::hexText(binary, byteMode);
-    }
-    return agrees;
+    return Hex2Bit::convertHexString2Int(text.c_str(), count) == number &&
+           Hex2Bit::convertHexString2Long(text.c_str(), count) == number &&
+           taken(Hex2Bit::convertBinString2HexString(text.c_str(), count, byteMode)) ==
+               HexModel::hexText(binary, byteMode);
 }
 
 /// A vector as characters, and as hex digits from an address on.
-inline bool vectorAgrees(const HexModel::NumberedVec& vector, std::size_t address, std::size_t digits, bool stop) {
+inline bool vectorAgrees(const HexModel::NumberedVec& vector, std::size_t address, unsigned bitsPerAddress,
+                         std::size_t digits, bool stop) {
     const std::string binary = HexModel::binaryText(Model(vector, vector.numbering));
-    std::string expected;
     std::vector<char> out(vector.length() / 8 + 1);
-    const bool result = HexModel::characters(binary, stop, expected);
-    const bool agrees = Hex2Bit::convertBitVec2String(&vector, out.data(), stop) == result && out.data() == expected;
-    return agrees &&
-           taken(Hex2Bit::getHexStringByHexAddress(&vector, static_cast<int>(address), static_cast<int>(digits), 1)) ==
-               (address < binary.size() ? HexModel::hexAt(binary, address, digits) : "(null)");
+    const bool isWhole = Hex2Bit::convertBitVec2String(&vector, out.data(), stop);
+    const std::size_t position = address * bitsPerAddress;
+    return std::pair(isWhole, std::string(out.data())) == HexModel::characters(binary, stop) &&
+           taken(Hex2Bit::getHexStringByHexAddress(&vector, static_cast<int>(address), static_cast<int>(digits),
+                                                   static_cast<int>(bitsPerAddress))) ==
+               (position < binary.size() ? HexModel::hexAt(binary, position, digits) : "(null)");
 }
 
-/// A number into the vector, taken without a sign and with one, counted from either end.
-inline bool numberAgrees(HexModel::NumberedVec& vector, std::uint32_t value) {
-    bool agrees = true;
-    for (const bool fromIndexZero : {false, true}) {
-        for (const bool isSigned : {false, true}) {
-            const auto number = static_cast<int>(value);
-            isSigned ? Hex2Bit::convertInt2BitVec(number, 9, &vector, fromIndexZero)
-                     : Hex2Bit::convertInt2BitVec(value, 9, &vector, fromIndexZero);
-            Model model(RLBitVec(vector.length(), Hex2Bit::m_initValue), vector.numbering);
-            HexModel::writeNumber(model, isSigned && number < 0 ? 0 : value, fromIndexZero);
-            agrees = agrees && Model(vector).bytes == model.bytes;
-        }
-    }
-    return agrees;
+/// A number into the vector, taken with a sign or without, counted from either end.
+inline bool numberAgrees(HexModel::NumberedVec& vector, std::uint32_t value, bool isSigned, bool fromIndexZero) {
+    const auto number = static_cast<int>(value);
+    isSigned ? Hex2Bit::convertInt2BitVec(number, 9, &vector, fromIndexZero)
+             : Hex2Bit::convertInt2BitVec(value, 9, &vector, fromIndexZero);
+    Model model(RLBitVec(vector.length(), Hex2Bit::m_initValue), vector.numbering);
+    HexModel::writeNumber(model, isSigned && number < 0 ? 0 : value, fromIndexZero);
+    return Model(vector).bytes == model.bytes;
 }
 
 /// All of these on the input's bytes behind the first four, which tell how. The fill value stays set.
@@ -132,10 +119,13 @@ inline bool allAgree(Input input) {
     const auto* const bytes = reinterpret_cast<const unsigned char*>(text.data());
     const std::size_t length = 8 * text.size() - (text.empty() ? 0 : flags % 8);
     HexModel::NumberedVec vector(RLBitVec(bytes, length), numbering);
+    const std::uint32_t value = (flags << 24 | more << 16 | low << 8 | high) >> more % 32;
     return loadAgrees({target, numbering}, text, places, descending, byteSwap) &&
-           charactersAgree(text, descending, byteSwap) && bytesAgree(bytes, static_cast<int>(length)) &&
-           textAgrees(input.text(), static_cast<int>(more)) && vectorAgrees(vector, low, more / 2 * 2, flags >= 128) &&
-           numberAgrees(vector, (flags << 24 | more << 16 | low << 8 | high) >> more % 32);
+           charactersAgree(text, descending, byteSwap) &&
+           bytesAgree(bytes, static_cast<int>(length), descending, byteSwap) &&
+           textAgrees(input.text(), static_cast<int>(more), byteSwap) &&
+           vectorAgrees(vector, low, flags % 16, more / 2 * 2, flags >= 128) &&
+           numberAgrees(vector, value, descending, byteSwap);
 }
 
 }  // namespace HexChecks

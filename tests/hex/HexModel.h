@@ -12,26 +12,9 @@
 
 namespace HexModel {
 
-/// An RLBitVec whose numbering can be chosen.
-struct NumberedVec : RLBitVec {
-    NumberedVec(const RLBitVec& bits, Numbering chosen) : RLBitVec(bits), numbering(chosen) {
-        m_forwardIndex = chosen == Numbering::Forward ? 1 : 0;
-        m_byteMirrorIndex = chosen == Numbering::Mirrored ? 7 : 0;
-    }
-    NumberedVec(std::size_t length, Numbering chosen) : NumberedVec(RLBitVec(length), chosen) {}
-
-    const Numbering numbering;
-};
+using ::NumberedVec;
 
 constexpr Numbering numberings[] = {Numbering::Usual, Numbering::Forward, Numbering::Mirrored};
-
-inline unsigned char mirrored(unsigned char byte) {
-    unsigned result = 0;
-    for (int bit = 0; bit < 8; ++bit) {
-        result = result << 1 | (byte >> bit & 1U);
-    }
-    return static_cast<unsigned char>(result);
-}
 
 inline void loadHex(Model& model, std::string text, int size, bool descending, bool byteSwap) {
     for (std::size_t i = 1; byteSwap && i < text.size(); i += 2) {
@@ -72,6 +55,10 @@ inline std::string turned(std::string text) {
     return text;
 }
 
+inline unsigned char mirrored(unsigned char byte) {
+    return static_cast<unsigned char>(std::bitset<8>(turned(std::bitset<8>(byte).to_string())).to_ulong());
+}
+
 inline std::string hexText(std::string binary, bool byteMode) {
     const std::size_t group = byteMode ? 8 : 4;
     binary.resize((binary.size() + group - 1) / group * group, '0');
@@ -97,18 +84,19 @@ inline void writeNumber(Model& model, std::uint32_t value, bool fromIndexZero) {
     }
 }
 
-/// The vector's characters from index 0 on; false when one above 127 ended it.
-inline bool characters(const std::string& binary, bool stopAtNonAscii, std::string& text) {
+/// The vector's characters from index 0 on, behind false when one above 127 ended them.
+inline std::pair<bool, std::string> characters(const std::string& binary, bool stopAtNonAscii) {
+    std::string text;
     for (std::size_t first = 0; first + 8 <= binary.size(); first += 8) {
         const unsigned long value = std::stoul(binary.substr(first, 8), nullptr, 2);
         if (value > 127 && stopAtNonAscii) {
-            return false;
+            return {false, text};
         }
         if (value > 0 && value < 128) {
             text += static_cast<char>(value);
         }
     }
-    return true;
+    return {true, text};
 }
 
 /// Hex digits of the vector from the position up, in byte mode.

@@ -2,7 +2,6 @@
 // model, with either width of the kernels.
 #include "Hex2Bit.h"
 
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -33,7 +32,7 @@ std::string bitsOf(const RLBitVec& vector) {
 TEST_F(Hex2BitTest, RandomDataAgreesWithTheModel) {
     const MessageRecorder silent;
     Chance chance;
-    for (std::size_t round = 0; round < std::size_t{151} * 60; ++round) {
+    for (std::size_t round = 0; round < std::size_t{151} * 120; ++round) {
         const VectorWidth width(chance.coin());
         const bool isLong = round % 151 == 0;
         const std::size_t size = isLong ? chance.below(30000) : round % 151;
@@ -64,7 +63,7 @@ std::vector<Cells> guideRows(std::size_t cellCount) {
 
 TEST_F(Hex2BitTest, LoadsBecomeWhatTheGuideSays) {
     const auto rows = guideRows(7);
-    ASSERT_THAT(rows, testing::SizeIs(10));
+    ASSERT_EQ(rows.size(), 10U);
     for (const Cells& row : rows) {
         RLBitVec vector(std::stoul(row[1]));
         Hex2Bit::convertHexString2BitVec(&vector, row[0].c_str(), std::stoi(row[2]), row[3] == "true", row[4] == "true",
@@ -77,7 +76,7 @@ TEST_F(Hex2BitTest, LoadsBecomeWhatTheGuideSays) {
 TEST_F(Hex2BitTest, TextsBecomeWhatTheGuideSays) {
     const auto bytes = Hex2Bit::convertHexString2BinData("A10F", 16, true, true);
     const auto rows = guideRows(5);
-    ASSERT_THAT(rows, testing::SizeIs(6));
+    ASSERT_EQ(rows.size(), 6U);
     for (const Cells& row : rows) {
         const char* const text =
             Hex2Bit::convertBinData2HexString(bytes.get(), std::stoi(row[1]), row[2] == "true", row[3] == "true");
@@ -102,11 +101,11 @@ TEST_F(Hex2BitTest, ByteBuffersAreMirrored) {
     }
     EXPECT_NE(std::unique_ptr<unsigned char[]>(Hex2Bit::reverseBufferBits(nullptr, -1)), nullptr);
     Hex2Bit::reverseReadBufferBits(nullptr, 3);
+    EXPECT_EQ(Hex2Bit::swapBits(0x12), 0x48);
 }
 
-TEST_F(Hex2BitTest, SwapsBitsAndBytes) {
+TEST_F(Hex2BitTest, NeighbouringBytesAreSwapped) {
     Bytes five{1, 2, 3, 4, 5};
-    EXPECT_EQ(Hex2Bit::swapBits(0x12), 0x48);
     EXPECT_EQ(Hex2Bit::swapBytes(five.data(), 5), five.data());
     EXPECT_EQ(five, (Bytes{2, 1, 4, 3, 5}));
     EXPECT_EQ(Hex2Bit::swapBytes(nullptr, 4), nullptr);
@@ -122,7 +121,6 @@ TEST_F(Hex2BitTest, TextsAndNumbersOfWhatIsMissingOrEmpty) {
     EXPECT_EQ(Hex2Bit::convertBin2Int(bytes, -1), 0);
     EXPECT_EQ(Hex2Bit::convertBin2Int(nullptr, 8), 0);
     EXPECT_EQ(Hex2Bit::convertHexString2Int("12", -3), 0);
-    EXPECT_EQ(Hex2Bit::convertHexString2Int("1 2", 2), 0x20) << "three characters counted: the digit 1 is cut";
     Hex2Bit::setInitValue(true);
     EXPECT_EQ(Hex2Bit::convertHexString2Int(nullptr, 2), 0xFF);
 }
@@ -177,10 +175,8 @@ TEST_F(Hex2BitTest, VectorsToCharacters) {
     EXPECT_FALSE(Hex2Bit::convertBitVec2String(plain.get(), nullptr));
 }
 
-TEST_F(Hex2BitTest, HexDigitsAtAnAddress) {
-    const unsigned char bytes[] = {0xA1, 0x0F, 0x33, 0xCC};
-    const RLBitVec vector(bytes, 32);
-    EXPECT_EQ(taken(Hex2Bit::getHexStringByHexAddress(&vector, 3, 6, 8)), "cc0000") << "nothing behind the end";
+TEST_F(Hex2BitTest, OutsideTheVectorThereAreNoHexDigits) {
+    const RLBitVec vector(32);
     EXPECT_EQ(taken(Hex2Bit::getHexStringByHexAddress(&vector, 0, -2, 8)), "");
     for (const int address : {4, -1, 0x7FFFFFFF}) {
         EXPECT_EQ(Hex2Bit::getHexStringByHexAddress(&vector, address, 2, 8), nullptr) << address;
