@@ -32,7 +32,7 @@ std::string bitsOf(const RLBitVec& vector) {
 TEST_F(Hex2BitTest, RandomDataAgreesWithTheModel) {
     const MessageRecorder silent;
     Chance chance;
-    for (std::size_t round = 0; round < std::size_t{151} * 120; ++round) {
+    for (std::size_t round = 0; round < std::size_t{151} * 90; ++round) {
         const VectorWidth width(chance.coin());
         const bool isLong = round % 151 == 0;
         const std::size_t size = isLong ? chance.below(30000) : round % 151;
