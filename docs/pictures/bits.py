@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Draws the pictures of docs/bits.md from bits.csv.
+"""Draws the pictures of docs/bits.md from bits.csv, which the tests compare with what the library does.
 
 usage: bits.py DIRECTORY
 """

@@ -4,6 +4,7 @@
 #include <tuple>
 
 #include "BitView.h"
+#include "EnvironmentVariable.h"
 #include "Register.h"
 
 namespace {
@@ -91,6 +92,20 @@ TEST(Register, PrintsItsPartsAndItsTotal) {
               "Register: [\n  0 0 0 0 0 0 0 \n]\n\n"
               "Address: [\n  0 0 \n]\n\nData: [\n  1 1 1 \n]\n\n"
               "Status: [\n  0 0 \n]\n\nTotal Register[\n  0 0 1 1 1 0 0 \n]\n\n");
+}
+
+TEST(Register, PrintsItsWorkWhenTheVariableIsSet) {
+    const EnvironmentVariable variable("TESSALREGISTERDUMPDATA", "off");
+    Register a(1, 1, 1);
+    Register b(1, 1, 1);
+    testing::internal::CaptureStdout();
+    a.setStatus(1);
+    EXPECT_TRUE(a == b);
+    EXPECT_EQ(testing::internal::GetCapturedStdout(),
+              "status: [\n  1 \n]\n\n"
+              "Operand1 data [\n  0 0 0 \n]\n\nMask [\n  0 1 1 \n]\n\n"
+              "Operand2 data [\n  0 0 0 \n]\n\nMask [\n  0 1 1 \n]\n\n"
+              "&[\n  0 0 0 \n]\n\n&[\n  0 0 0 \n]\n\nReCalculating ...\n[\n  1 0 0 \n]\n\n");
 }
 
 TEST(Register, WithoutVectorsAnswersWithNothing) {

@@ -84,6 +84,18 @@ TYPED_TEST(BothVectors, PrintFromStoragePositionZeroUp) {
     EXPECT_EQ(testing::internal::GetCapturedStdout(), stream.str());
 }
 
+// The model of the random operations reads both the same way; these are written down from the right end.
+TEST(RLBitVec, AppendsBehindItsRightEndAndShiftsTowardsTheEndsAsRead) {
+    RLBitVec vector = from<RLBitVec>("1100");
+    vector += from<RLBitVec>("101");
+    EXPECT_EQ(storage(vector), "1011100");
+    vector << 2;
+    EXPECT_EQ(storage(vector), "0010111");
+    vector >> 3;
+    EXPECT_EQ(storage(vector), "0111000");
+    EXPECT_EQ(storage(static_cast<LRBitVec&>(vector) >> 1), "0011100");
+}
+
 TEST(RLBitVec, TakesFieldsAsTextAndRefusesThoseThatDoNotFit) {
     RLBitVec vector(16);
     vector.updateBitField("1x11", 2);
