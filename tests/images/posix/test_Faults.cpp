@@ -40,7 +40,7 @@ TEST(Faults, AFullDiskLeavesTheOldFilesAndNoHalfOnes) {
     ::signal(SIGXFSZ, former);
 }
 
-TEST(Faults, WhatIsNoPlainFileIsNeitherReadNorReplaced) {
+TEST(Faults, ALinkIsFollowedAndWhatIsNoPlainFileIsNeitherReadNorReplaced) {
     Workbench bench;
     bench.write("a", "abc");
     ASSERT_EQ(::mkfifo((bench / "pipe").c_str(), 0600), 0);
@@ -50,6 +50,9 @@ TEST(Faults, WhatIsNoPlainFileIsNeitherReadNorReplaced) {
     EXPECT_FALSE(bench.generate("-generic -output q -data /dev/zero"));
     EXPECT_THAT(bench.said(), testing::HasSubstr("/dev/zero: is no plain file"));
     EXPECT_TRUE(std::filesystem::is_fifo(bench / "p.mcs"));
+    std::filesystem::create_symlink(bench.write("old", ""), bench / "r.mcs");
+    EXPECT_TRUE(bench.generate("-generic -output r -data @a"));
+    EXPECT_EQ(bench.read("old").substr(0, 1), ":");
 }
 
 }  // namespace
