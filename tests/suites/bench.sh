@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # about: every row of the benchmark table runs, once and shortly
-# needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h python3=python3
+# needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h libboost-dev=/usr/include/boost/dynamic_bitset.hpp python3=python3
 # limit: 600
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"

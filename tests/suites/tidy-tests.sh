@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # about: clang-tidy over the tests, the fuzz targets and the benchmarks
-# needs: clang-tidy=clang-tidy clang=clang++ libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h
+# needs: clang-tidy=clang-tidy clang=clang++ libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h libboost-dev=/usr/include/boost/dynamic_bitset.hpp
 # limit: 1800
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
