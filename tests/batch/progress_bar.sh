@@ -4,6 +4,7 @@
 #     progress_bar.sh PROGRAM DATA
 set -euo pipefail
 
+script -qec true /dev/null </dev/null >/dev/null 2>&1 || { echo "skipped: there is no pseudo-terminal"; exit 77; }
 folder=$(mktemp -d)
 trap 'rm -rf "$folder"' EXIT
 truncate -s 3M "$folder/zeros"
