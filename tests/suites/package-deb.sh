@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # about: Debian packages of library, data, headers and tools, unpacked and used: CMake, pkg-config, tools, completion, pages
-# needs: dpkg-dev=dpkg-shlibdeps pkg-config=pkg-config man-db=man
+# needs: dpkg-dev=dpkg-shlibdeps file=file pkg-config=pkg-config man-db=man
 # limit: 600
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
