@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # about: unit tests, optimised build by g++
-# needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h zsh=zsh fish=fish
+# needs: libgtest-dev=/usr/include/gtest/gtest.h libgmock-dev=/usr/include/gmock/gmock.h libbenchmark-dev=/usr/include/benchmark/benchmark.h zsh=zsh fish=fish python3=python3 srecord=srec_cmp spin=spin gdb=gdb
 # limit: 1500
 set -euo pipefail
 source "$(dirname "${BASH_SOURCE[0]}")/lib/steps.sh"
