@@ -3,7 +3,6 @@
 #pragma once
 
 #include <algorithm>
-#include <cstdint>
 #include <functional>
 #include <string_view>
 #include <tuple>
@@ -16,9 +15,10 @@ enum class Numbering { Storage, Usual, Forward, Mirrored };
 /// An RLBitVec whose numbering can be chosen.
 struct NumberedVec : RLBitVec {
     NumberedVec(const RLBitVec& bits, Numbering chosen) : RLBitVec(bits), numbering(chosen) {
-        m_byteMirrorIndex = chosen == Numbering::Mirrored ? 7 : 0;
-        const bool isEither = m_byteMirrorIndex != 0 && bits.length() % 2 != 0;  // beside the mirror it does not count
-        m_forwardIndex = chosen == Numbering::Forward || isEither ? 1 : 0;
+        const bool isMirrored = chosen == Numbering::Mirrored;
+        m_byteMirrorIndex = isMirrored ? 7 : 0;
+        // Beside the mirror the forward index does not count: mirrored vectors of odd lengths have both.
+        m_forwardIndex = chosen == Numbering::Forward || (isMirrored && bits.length() % 2 != 0) ? 1 : 0;
     }
     NumberedVec(std::size_t length, Numbering chosen) : NumberedVec(RLBitVec(length), chosen) {}
 

@@ -6,13 +6,13 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <fstream>
 #include <iomanip>
 #include <sstream>
 #include <string>
 #include <tuple>
 #include <vector>
 
+#include "Blocks.h"
 #include "MessageRecorder.h"
 
 namespace {
@@ -109,7 +109,7 @@ std::string asked(const std::string& line, std::string& format) {
     if (question == "format") {
         format = rest;
         const HkString fault = HkCmdArgs::checkFormat(format.c_str());
-        answer << (fault.IsEmpty() ? "" : "! ") << fault << (fault.IsEmpty() ? "" : "\n");
+        answer << (fault.IsEmpty() ? "" : "! " + std::string(fault) + '\n');
     } else if (question == "$") {
         for (const std::string& result : parse(format.c_str(), rest)) {
             answer << result << '\n';
@@ -130,16 +130,11 @@ std::string asked(const std::string& line, std::string& format) {
 
 TEST(HkCmdArgs, GivesWhatTheDocumentsShow) {
     for (const char* const path : {SHIPPED_DATA_DIR "/../docs/argument-format.md", TEST_DATA_DIR "/cmdargs/cases.md"}) {
-        std::ifstream file(path);
         std::string shown;
         std::string given;
         std::string format;
-        bool inside = false;
-        for (std::string line; std::getline(file, line);) {
-            line.erase(line.find_last_not_of(" \r") + 1);
-            if (line.rfind("```", 0) == 0) {
-                inside = line == "```args";
-            } else if (inside) {
+        for (const Lines& block : blocksOf(path, "args")) {
+            for (const std::string& line : block) {
                 shown += line + '\n';
                 given += asked(line, format);
             }

@@ -4,7 +4,7 @@
 
 #include "HkString.h"
 #include "Register.h"
-#include "hex/HexModel.h"
+#include "bits/Model.h"
 
 const unsigned char bytes[] = {0xA5, 0x0C};
 
@@ -21,8 +21,8 @@ LRBitVec movedLeft(bytes, 12);
 LRBitVec longLeft(1000, true);
 RLBitVec right(bytes, 12);
 RLBitVec longRight(1001);
-HexModel::NumberedVec forward(right, Numbering::Forward);
-HexModel::NumberedVec byteMirror(right, Numbering::Mirrored);
+NumberedVec forward(right, Numbering::Forward);
+NumberedVec byteMirror(right, Numbering::Mirrored);
 alignas(RLBitVec) unsigned char noVector[sizeof(RLBitVec)];
 alignas(RLBitVec) unsigned char wildVector[sizeof(RLBitVec)];
 

@@ -26,11 +26,10 @@ inline std::string taken(const char* text) {
 }
 
 /// The text as hex digits, and as binary digits up to its first zero character.
-inline bool loadAgrees(const HexModel::NumberedVec& target, std::string_view text, int places, bool descending,
-                       bool byteSwap) {
+inline bool loadAgrees(const NumberedVec& target, std::string_view text, int places, bool descending, bool byteSwap) {
     const std::string binaryText(text.substr(0, text.find('\0')));
-    HexModel::NumberedVec hex(target, target.numbering);
-    HexModel::NumberedVec binary(target, target.numbering);
+    NumberedVec hex(target, target.numbering);
+    NumberedVec binary(target, target.numbering);
     Model hexModel(target, target.numbering);
     Model binaryModel = hexModel;
     Hex2Bit::convertHexString2BitVec(&hex, text, places, descending, byteSwap, false);
@@ -80,8 +79,8 @@ inline bool textAgrees(const std::string& text, int count, bool byteMode) {
 }
 
 /// A vector as characters, and as hex digits from an address on.
-inline bool vectorAgrees(const HexModel::NumberedVec& vector, std::size_t address, unsigned bitsPerAddress,
-                         std::size_t digits, bool stop) {
+inline bool vectorAgrees(const NumberedVec& vector, std::size_t address, unsigned bitsPerAddress, std::size_t digits,
+                         bool stop) {
     const std::string binary = HexModel::binaryText(Model(vector, vector.numbering));
     std::vector<char> out(vector.length() / 8 + 1);
     const bool isWhole = Hex2Bit::convertBitVec2String(&vector, out.data(), stop);
@@ -93,7 +92,7 @@ inline bool vectorAgrees(const HexModel::NumberedVec& vector, std::size_t addres
 }
 
 /// A number into the vector, taken with a sign or without, counted from either end.
-inline bool numberAgrees(HexModel::NumberedVec& vector, std::uint32_t value, bool isSigned, bool fromIndexZero) {
+inline bool numberAgrees(NumberedVec& vector, std::uint32_t value, bool isSigned, bool fromIndexZero) {
     const auto number = static_cast<int>(value);
     isSigned ? Hex2Bit::convertInt2BitVec(number, 9, &vector, fromIndexZero)
              : Hex2Bit::convertInt2BitVec(value, 9, &vector, fromIndexZero);
@@ -118,7 +117,7 @@ inline bool allAgree(Input input) {
     const std::string_view text = input.bytes();
     const auto* const bytes = reinterpret_cast<const unsigned char*>(text.data());
     const std::size_t length = 8 * text.size() - (text.empty() ? 0 : flags % 8);
-    HexModel::NumberedVec vector(RLBitVec(bytes, length), numbering);
+    NumberedVec vector(RLBitVec(bytes, length), numbering);
     const std::uint32_t value = (flags << 24 | more << 16 | low << 8 | high) >> more % 32;
     return loadAgrees({target, numbering}, text, places, descending, byteSwap) &&
            charactersAgree(text, descending, byteSwap) &&

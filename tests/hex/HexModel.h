@@ -8,12 +8,9 @@
 #include <utility>
 #include <vector>
 
-#include "RLBitVec.h"
 #include "bits/Model.h"
 
 namespace HexModel {
-
-using ::NumberedVec;
 
 constexpr Numbering numberings[] = {Numbering::Usual, Numbering::Forward, Numbering::Mirrored};
 

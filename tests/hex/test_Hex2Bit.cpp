@@ -201,7 +201,7 @@ TEST_F(Hex2BitTest, NewVectors) {
 
 TEST_F(Hex2BitTest, FillValueAndInitialise) {
     Hex2Bit::setInitValue(true);
-    HexModel::NumberedVec vector(12, Numbering::Mirrored);
+    NumberedVec vector(12, Numbering::Mirrored);
     Hex2Bit::convertHexString2BitVec(&vector, "0", 4, false, false, true);
     EXPECT_EQ(bitsOf(vector), "000011111111");
     EXPECT_EQ(vector.data()[1], 0xF0) << "the usual numbering is back, and the slack is filled";

@@ -43,6 +43,7 @@ TEST(HkPath, FindsTheExtensionAndCopiesWhatFits) {
     };
     for (const auto& [path, extension] : cases) {
         SCOPED_TRACE(path);
+        EXPECT_STREQ(HkPath::GetExt(path, nullptr), extension);
         std::string writable(path);
         std::string buffer(HkPath::extensionSize + 1, '#');
         EXPECT_STREQ(HkPath::GetExt(writable.data(), buffer.data()), extension);

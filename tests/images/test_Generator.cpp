@@ -3,11 +3,10 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <fstream>
-#include <optional>
 #include <regex>
 #include <sstream>
 
+#include "Blocks.h"
 #include "DataPath.h"
 #include "HkFile.h"
 #include "IF_IMAGEGEN.h"
@@ -70,23 +69,17 @@ private:
     std::vector<std::pair<std::string, std::string>> m_files;
 };
 
-void runDocument(const char* path, int blocks) {
+void runDocument(const char* path, std::size_t count) {
     DeviceProfile::setDataPath(TEST_DATA_DIR "/prom");
-    std::ifstream document(path);
-    std::optional<Block> block;
-    int count = 0;
-    for (std::string line; std::getline(document, line);) {
-        if (line == "```prom") {
-            block.emplace();
-            ++count;
-        } else if (block && line == "```") {
-            block->runCommand();
-            block.reset();
-        } else if (block) {
-            block->readLine(line);
+    const auto blocks = blocksOf(path, "prom");
+    EXPECT_EQ(blocks.size(), count) << path;
+    for (const std::vector<std::string>& lines : blocks) {
+        Block block;
+        for (const std::string& line : lines) {
+            block.readLine(line);
         }
+        block.runCommand();
     }
-    EXPECT_EQ(count, blocks) << path;
 }
 
 TEST(Documents, AreTrue) {

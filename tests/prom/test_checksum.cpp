@@ -9,7 +9,7 @@
 #include "EnvironmentVariable.h"
 #include "MessageRecorder.h"
 #include "PromUtility.h"
-#include "hex/HexModel.h"
+#include "bits/Model.h"
 #include "s/ByteSum.h"
 
 namespace {
@@ -32,8 +32,8 @@ TEST(RowChecksum, EqualsTheSumBitByBitInAnyNumbering) {
     std::mt19937 random(20261124);
     for (const int bits : {8, 16, 64, 72, 1000, 1024, 4096, 10008}) {
         for (const int longer : {0, 1, 8, 13, 16}) {
-            HexModel::NumberedVec row(static_cast<std::size_t>(bits + longer),
-                                      longer == 16 ? Numbering::Mirrored : Numbering::Usual);
+            NumberedVec row(static_cast<std::size_t>(bits + longer),
+                            longer == 16 ? Numbering::Mirrored : Numbering::Usual);
             unsigned int sum = 0;
             for (int i = 0; i < bits; ++i) {
                 row[static_cast<std::size_t>(i)] = random() % 2 != 0;
